@@ -1,0 +1,184 @@
+// The companion core library: aligned memory, the largest cache, processor
+// features and status texts. Nothing here keeps state that changes after load.
+#include "pvxcore.h"
+
+#include <cpuid.h>
+#include <unistd.h>
+
+#include <cstdlib>
+
+namespace {
+
+constexpr int kAlign = 64;
+
+struct CpuId {
+    unsigned a = 0, b = 0, c = 0, d = 0;
+};
+
+CpuId Query(unsigned leaf, unsigned sub = 0)
+{
+    CpuId r;
+    if (!__get_cpuid_count(leaf, sub, &r.a, &r.b, &r.c, &r.d)) return CpuId{};
+    return r;
+}
+
+unsigned long long XGetBv()
+{
+    unsigned lo, hi;
+    __asm__ volatile("xgetbv" : "=a"(lo), "=d"(hi) : "c"(0));
+    return (static_cast<unsigned long long>(hi) << 32) | lo;
+}
+
+Pvx64u DetectFeatures()
+{
+    Pvx64u f = 0;
+    unsigned maxLeaf = Query(0).a;
+    if (maxLeaf < 1) return 0;
+    CpuId l1 = Query(1);
+    if (l1.d & (1u << 23)) f |= PVX_CPUID_MMX;
+    if (l1.d & (1u << 25)) f |= PVX_CPUID_SSE;
+    if (l1.d & (1u << 26)) f |= PVX_CPUID_SSE2;
+    if (l1.c & (1u << 0)) f |= PVX_CPUID_SSE3;
+    if (l1.c & (1u << 9)) f |= PVX_CPUID_SSSE3;
+    if (l1.c & (1u << 19)) f |= PVX_CPUID_SSE41;
+    if (l1.c & (1u << 20)) f |= PVX_CPUID_SSE42;
+    if (l1.c & (1u << 25)) f |= PVX_CPUID_AES;
+    if (l1.c & (1u << 1)) f |= PVX_CPUID_CLMUL;
+    if (l1.c & (1u << 23)) f |= PVX_CPUID_POPCNT;
+    // The AVX family counts only when the OS saves the wide registers.
+    bool osxsave = l1.c & (1u << 27);
+    unsigned long long xcr0 = osxsave ? XGetBv() : 0;
+    bool ymm = (xcr0 & 0x6) == 0x6;
+    bool zmm = (xcr0 & 0xe6) == 0xe6;
+    if (ymm && (l1.c & (1u << 28))) f |= PVX_CPUID_AVX;
+    if (ymm && (l1.c & (1u << 29))) f |= PVX_CPUID_F16C;
+    if (ymm && (l1.c & (1u << 12))) f |= PVX_CPUID_FMA;
+    if (maxLeaf >= 7) {
+        CpuId l7 = Query(7);
+        if (ymm && (l7.b & (1u << 5))) f |= PVX_CPUID_AVX2;
+        if (zmm && (l7.b & (1u << 16))) f |= PVX_CPUID_AVX512F;
+        if (l7.b & (1u << 3)) f |= PVX_CPUID_BMI1;
+        if (l7.b & (1u << 8)) f |= PVX_CPUID_BMI2;
+    }
+    return f;
+}
+
+// Largest cache from the deterministic cache parameters (leaf 4), with the
+// C runtime's view as a fallback for processors that lack the leaf.
+long long DetectMaxCache()
+{
+    long long best = 0;
+    if (Query(0).a >= 4) {
+        for (unsigned i = 0; i < 16; ++i) {
+            CpuId r = Query(4, i);
+            unsigned type = r.a & 0x1f;
+            if (type == 0) break;
+            if (type == 2) continue;  // instruction cache
+            long long ways = ((r.b >> 22) & 0x3ff) + 1;
+            long long parts = ((r.b >> 12) & 0x3ff) + 1;
+            long long line = (r.b & 0xfff) + 1;
+            long long sets = static_cast<long long>(r.c) + 1;
+            long long size = ways * parts * line * sets;
+            if (size > best) best = size;
+        }
+    }
+    if (best == 0) {
+        const int names[] = {_SC_LEVEL4_CACHE_SIZE, _SC_LEVEL3_CACHE_SIZE, _SC_LEVEL2_CACHE_SIZE,
+                             _SC_LEVEL1_DCACHE_SIZE};
+        for (int n : names) {
+            long v = sysconf(n);
+            if (v > best) best = v;
+        }
+    }
+    return best;
+}
+
+const Pvx64u kFeatures = DetectFeatures();
+const long long kMaxCache = DetectMaxCache();
+
+}  // namespace
+
+extern "C" {
+
+PVX_API void* pvxMalloc(int length)
+{
+    if (length < 1) return nullptr;
+    size_t n = (static_cast<size_t>(length) + kAlign - 1) & ~static_cast<size_t>(kAlign - 1);
+    return std::aligned_alloc(kAlign, n);
+}
+
+PVX_API void pvxFree(void* ptr)
+{
+    std::free(ptr);
+}
+
+PVX_API PvxStatus pvxGetMaxCacheSizeB(int* pSizeByte)
+{
+    if (!pSizeByte) return pvxStsNullPtrErr;
+    if (kMaxCache <= 0 || kMaxCache > 0x7fffffff) {
+        *pSizeByte = 0;
+        return pvxStsNotSupportedModeErr;
+    }
+    *pSizeByte = static_cast<int>(kMaxCache);
+    return pvxStsNoErr;
+}
+
+PVX_API Pvx64u pvxGetEnabledCpuFeatures(void)
+{
+    return kFeatures;
+}
+
+PVX_API int ownGetFeature(Pvx64u featureMask)
+{
+    return (kFeatures & featureMask) == featureMask;
+}
+
+PVX_API const char* pvxGetStatusString(PvxStatus status)
+{
+    switch (status) {
+    case pvxStsNoErr: return "pvxStsNoErr: success";
+    case pvxStsNoOperation: return "pvxStsNoOperation: warning: nothing to do, nothing written";
+    case pvxStsDivByZero: return "pvxStsDivByZero: warning: a divisor was zero; a defined value was written";
+    case pvxStsNoIntersection: return "pvxStsNoIntersection: warning: the region does not intersect the source; nothing written";
+    case pvxStsSizeWrn: return "pvxStsSizeWrn: warning: a size was smaller than needed; the result was completed in a reduced form";
+    case pvxStsBadArgErr: return "pvxStsBadArgErr: an argument value is outside its accepted set";
+    case pvxStsSizeErr: return "pvxStsSizeErr: a width or height is less than 1, or a size is out of range";
+    case pvxStsNullPtrErr: return "pvxStsNullPtrErr: a required pointer is null";
+    case pvxStsMemAllocErr: return "pvxStsMemAllocErr: a work buffer could not be allocated";
+    case pvxStsDivByZeroErr: return "pvxStsDivByZeroErr: the constant divisor is zero";
+    case pvxStsOutOfRangeErr: return "pvxStsOutOfRangeErr: an offset or point lies outside the image or the prepared range";
+    case pvxStsDataTypeErr: return "pvxStsDataTypeErr: the pixel-type code is not supported";
+    case pvxStsScaleRangeErr: return "pvxStsScaleRangeErr: the value range is empty";
+    case pvxStsStepErr: return "pvxStsStepErr: a step is less than 1 or too small for the row";
+    case pvxStsFftOrderErr: return "pvxStsFftOrderErr: an FFT order is out of range";
+    case pvxStsContextMatchErr: return "pvxStsContextMatchErr: the spec or state object is not of the expected kind";
+    case pvxStsMoment00ZeroErr: return "pvxStsMoment00ZeroErr: the zero-order moment is too small to normalise";
+    case pvxStsMirrorFlipErr: return "pvxStsMirrorFlipErr: the flip axis is not 0, 1 or 2";
+    case pvxStsInterpolationErr: return "pvxStsInterpolationErr: the interpolation code is not supported";
+    case pvxStsResizeFactorErr: return "pvxStsResizeFactorErr: a resize factor is out of range";
+    case pvxStsMaskSizeErr: return "pvxStsMaskSizeErr: a mask size is invalid";
+    case pvxStsAnchorErr: return "pvxStsAnchorErr: the anchor lies outside the mask";
+    case pvxStsEpsValErr: return "pvxStsEpsValErr: the tolerance is negative";
+    case pvxStsStrideErr: return "pvxStsStrideErr: a step is too small for the row plus the border";
+    case pvxStsChannelErr: return "pvxStsChannelErr: a channel count or channel index is out of range";
+    case pvxStsAlphaTypeErr: return "pvxStsAlphaTypeErr: the alpha-composition operation is not supported";
+    case pvxStsDivisorErr: return "pvxStsDivisorErr: an integer filter divisor is zero";
+    case pvxStsNumChannelsErr: return "pvxStsNumChannelsErr: the channel count is not served";
+    case pvxStsChannelOrderErr: return "pvxStsChannelOrderErr: a channel-order entry is out of range";
+    case pvxStsQuadErr: return "pvxStsQuadErr: a quadrangle is degenerate";
+    case pvxStsRectErr: return "pvxStsRectErr: a rectangle is degenerate";
+    case pvxStsCoeffErr: return "pvxStsCoeffErr: transform coefficients are singular";
+    case pvxStsLUTNofLevelsErr: return "pvxStsLUTNofLevelsErr: a look-up table has fewer than 2 levels";
+    case pvxStsHistoNofLevelsErr: return "pvxStsHistoNofLevelsErr: a histogram has fewer than 2 levels";
+    case pvxStsNotEvenStepErr: return "pvxStsNotEvenStepErr: a step is not a multiple of the element size";
+    case pvxStsNoiseValErr: return "pvxStsNoiseValErr: the noise parameter is out of range";
+    case pvxStsResizeTooSmallErr: return "pvxStsResizeTooSmallErr: the destination is too small for the resize method";
+    case pvxStsRoundModeNotSupportedErr: return "pvxStsRoundModeNotSupportedErr: the rounding mode is not supported";
+    case pvxStsBorderErr: return "pvxStsBorderErr: the border type is not served by this function";
+    case pvxStsOddOffsetErr: return "pvxStsOddOffsetErr: an x offset or width must be even";
+    case pvxStsNotSupportedModeErr: return "pvxStsNotSupportedModeErr: a valid combination this library does not serve";
+    default: return "unknown status";
+    }
+}
+
+}  // extern "C"

@@ -1,0 +1,104 @@
+// A thin layer over 128-bit SSE4.2 vectors, so that kernels say what they do
+// (saturation and signedness in the name) instead of spelling intrinsics. A
+// wider build is a new layer with the same names, not a rewrite of kernels.
+// Add an op here only when a kernel needs it.
+#pragma once
+
+#include <nmmintrin.h>
+#include <smmintrin.h>
+
+#include <cstdint>
+
+namespace pvx::simd {
+
+using VI = __m128i;  // 16 bytes of integers
+using VF = __m128;   // 4 floats
+using VD = __m128d;  // 2 doubles
+
+inline constexpr int kBytes = 16;
+
+inline bool IsAligned(const void* p) { return (reinterpret_cast<std::uintptr_t>(p) & 15) == 0; }
+
+// ---- loads and stores ----
+inline VI LoadU(const void* p) { return _mm_loadu_si128(static_cast<const VI*>(p)); }
+inline VI LoadA(const void* p) { return _mm_load_si128(static_cast<const VI*>(p)); }
+inline VI LoadNt(const void* p) { return _mm_stream_load_si128(const_cast<VI*>(static_cast<const VI*>(p))); }
+inline VI LoadLo64(const void* p) { return _mm_loadl_epi64(static_cast<const VI*>(p)); }
+inline void StoreU(void* p, VI v) { _mm_storeu_si128(static_cast<VI*>(p), v); }
+inline void StoreA(void* p, VI v) { _mm_store_si128(static_cast<VI*>(p), v); }
+inline void StoreNt(void* p, VI v) { _mm_stream_si128(static_cast<VI*>(p), v); }
+inline void StoreLo64(void* p, VI v) { _mm_storel_epi64(static_cast<VI*>(p), v); }
+inline void StoreFence() { _mm_sfence(); }
+
+inline VF LoadUF(const float* p) { return _mm_loadu_ps(p); }
+inline VF LoadAF(const float* p) { return _mm_load_ps(p); }
+inline void StoreUF(float* p, VF v) { _mm_storeu_ps(p, v); }
+inline void StoreAF(float* p, VF v) { _mm_store_ps(p, v); }
+
+// Aligned or unaligned access chosen once per row by the caller.
+template <bool A> inline VI Load(const void* p) { if constexpr (A) return LoadA(p); else return LoadU(p); }
+template <bool A> inline void Store(void* p, VI v) { if constexpr (A) StoreA(p, v); else StoreU(p, v); }
+
+// ---- constants ----
+inline VI Zero() { return _mm_setzero_si128(); }
+inline VF ZeroF() { return _mm_setzero_ps(); }
+inline VI SplatU8(std::uint8_t v) { return _mm_set1_epi8(static_cast<char>(v)); }
+inline VI SplatU16(std::uint16_t v) { return _mm_set1_epi16(static_cast<short>(v)); }
+inline VI SplatU32(std::uint32_t v) { return _mm_set1_epi32(static_cast<int>(v)); }
+inline VI SplatU64(std::uint64_t v) { return _mm_set1_epi64x(static_cast<long long>(v)); }
+inline VF SplatF(float v) { return _mm_set1_ps(v); }
+
+// ---- bitwise ----
+inline VI And(VI a, VI b) { return _mm_and_si128(a, b); }
+inline VI Or(VI a, VI b) { return _mm_or_si128(a, b); }
+inline VI Xor(VI a, VI b) { return _mm_xor_si128(a, b); }
+inline VI AndNot(VI notThis, VI b) { return _mm_andnot_si128(notThis, b); }
+// Bytes of b where the mask byte's top bit is set, else bytes of a.
+inline VI SelectBytes(VI a, VI b, VI mask) { return _mm_blendv_epi8(a, b, mask); }
+inline VI ShuffleBytes(VI v, VI idx) { return _mm_shuffle_epi8(v, idx); }
+
+// ---- integer arithmetic ----
+inline VI AddSatU8(VI a, VI b) { return _mm_adds_epu8(a, b); }
+inline VI SubSatU8(VI a, VI b) { return _mm_subs_epu8(a, b); }
+inline VI AddSatU16(VI a, VI b) { return _mm_adds_epu16(a, b); }
+inline VI SubSatU16(VI a, VI b) { return _mm_subs_epu16(a, b); }
+inline VI AddSatS16(VI a, VI b) { return _mm_adds_epi16(a, b); }
+inline VI SubSatS16(VI a, VI b) { return _mm_subs_epi16(a, b); }
+inline VI AddI16(VI a, VI b) { return _mm_add_epi16(a, b); }
+inline VI SubI16(VI a, VI b) { return _mm_sub_epi16(a, b); }
+inline VI AddI32(VI a, VI b) { return _mm_add_epi32(a, b); }
+inline VI SubI32(VI a, VI b) { return _mm_sub_epi32(a, b); }
+inline VI MulLoI16(VI a, VI b) { return _mm_mullo_epi16(a, b); }
+inline VI MulLoI32(VI a, VI b) { return _mm_mullo_epi32(a, b); }
+inline VI EqU8(VI a, VI b) { return _mm_cmpeq_epi8(a, b); }
+inline VI EqI32(VI a, VI b) { return _mm_cmpeq_epi32(a, b); }
+
+// ---- widening and narrowing ----
+inline VI WidenLoU8(VI v) { return _mm_cvtepu8_epi16(v); }
+inline VI WidenHiU8(VI v) { return _mm_unpackhi_epi8(v, _mm_setzero_si128()); }
+inline VI WidenLoU16(VI v) { return _mm_cvtepu16_epi32(v); }
+inline VI WidenHiU16(VI v) { return _mm_unpackhi_epi16(v, _mm_setzero_si128()); }
+inline VI WidenLoS16(VI v) { return _mm_cvtepi16_epi32(v); }
+inline VI WidenHiS16(VI v) { return _mm_srai_epi32(_mm_unpackhi_epi16(v, v), 16); }
+inline VI PackUsS16(VI a, VI b) { return _mm_packus_epi16(a, b); }  // s16 -> u8, saturating
+inline VI PackSsS16(VI a, VI b) { return _mm_packs_epi16(a, b); }   // s16 -> s8, saturating
+inline VI PackUsS32(VI a, VI b) { return _mm_packus_epi32(a, b); }  // s32 -> u16, saturating
+inline VI PackSsS32(VI a, VI b) { return _mm_packs_epi32(a, b); }   // s32 -> s16, saturating
+
+// ---- float ----
+inline VF AddF(VF a, VF b) { return _mm_add_ps(a, b); }
+inline VF SubF(VF a, VF b) { return _mm_sub_ps(a, b); }
+inline VF MulF(VF a, VF b) { return _mm_mul_ps(a, b); }
+inline VF DivF(VF a, VF b) { return _mm_div_ps(a, b); }
+inline VF MinF(VF a, VF b) { return _mm_min_ps(a, b); }
+inline VF MaxF(VF a, VF b) { return _mm_max_ps(a, b); }
+inline VF RcpF(VF a) { return _mm_rcp_ps(a); }
+inline VF TruncF(VF a) { return _mm_round_ps(a, _MM_FROUND_TO_ZERO | _MM_FROUND_NO_EXC); }
+// Rounds by the thread's current rounding control (see FpGuard).
+inline VI CvtF32(VF a) { return _mm_cvtps_epi32(a); }
+inline VI CvtTruncF32(VF a) { return _mm_cvttps_epi32(a); }
+inline VF CvtI32F(VI a) { return _mm_cvtepi32_ps(a); }
+inline VI AsInt(VF a) { return _mm_castps_si128(a); }
+inline VF AsFloat(VI a) { return _mm_castsi128_ps(a); }
+
+}  // namespace pvx::simd

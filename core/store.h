@@ -1,0 +1,27 @@
+// The cache-aware store choice of the large-region writers: regions above a
+// family's threshold that are at least as large as the largest cache are
+// written with non-temporal stores so that they do not evict the caller's
+// working set. The pixels written are the same either way.
+#pragma once
+
+#include <cstdint>
+
+#include "pvxcore.h"
+
+namespace pvx {
+
+// Thresholds in bytes written, by family.
+inline constexpr std::int64_t kNtThresholdSet = 1048576;
+inline constexpr std::int64_t kNtThresholdSmall = 262144;
+inline constexpr std::int64_t kNtThresholdMedium = 524289;
+inline constexpr std::int64_t kNtThresholdLarge = 786433;
+
+inline bool UseNonTemporal(std::int64_t bytesWritten, std::int64_t threshold)
+{
+    if (bytesWritten <= threshold) return false;
+    int cache = 0;
+    if (pvxGetMaxCacheSizeB(&cache) != pvxStsNoErr) return false;
+    return bytesWritten >= cache;
+}
+
+}  // namespace pvx
