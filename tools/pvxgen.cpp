@@ -305,15 +305,18 @@ int main(int argc, char** argv)
     std::string map = "/* generated from the family tables (*.api) by tools/pvxgen; do not edit */\n";
     map += "{\n  global:\n";
     std::string man = "// generated from the family tables (*.api) by tools/pvxgen; do not edit\n";
-    man += "// PVX_MANIFEST(name, table, group, type, layout, signature)\n";
+    man += "// PVX_MANIFEST(name, table, group, type, layout, signature, return type, pointer parameters)\n";
     for (const auto& t : tables) {
         for (const auto& f : t.fns) {
             idx += "    kEntry_" + f.name + ",\n";
             tab += f.ret + " " + f.name + "(" + f.params + ");\n";
             init += "    reinterpret_cast<EntryFn>(&body::" + f.name + "),\n";
             map += "    " + f.name + ";\n";
+            int pointers = 0;
+            for (const auto& p : Split(f.params, ','))
+                if (p.find('*') != std::string::npos || p.find('[') != std::string::npos) ++pointers;
             man += "PVX_MANIFEST(" + f.name + ", \"" + t.path + "\", \"" + f.group + "\", \"" + f.type + "\", \"" +
-                   f.layout + "\", " + f.sig + ")\n";
+                   f.layout + "\", " + f.sig + ", " + f.ret + ", " + std::to_string(pointers) + ")\n";
         }
     }
     idx += "    kEntryCount\n};\n\n}  // namespace pvx\n";
