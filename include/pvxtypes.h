@@ -172,6 +172,12 @@ typedef struct {
     int bottom;
 } PvxiBorderSize;
 
+/* Spec objects are laid out for x86-64. Where a head holds pointers it is
+ * larger than on a 32-bit platform: the histogram spec's head (data type,
+ * channels, uniform flag, identifier, four level counts, four level-array
+ * pointers) is 64 bytes here, not 48, so its size is 64 + 4 x (sum of
+ * nLevels over the channels). */
+
 /* The version record; constant for the life of the process. */
 typedef struct {
     int majorVersion;
