@@ -12,7 +12,7 @@ jobs=$(pvx_jobs)
 out=${1:-demo-out}
 
 cmake -S . -B build-demo -DCMAKE_BUILD_TYPE=Release \
-    -DPVX_BUILD_TESTS=OFF -DPVX_BUILD_BENCH=OFF -DPVX_BUILD_DEMO=ON
+    -DPVX_BUILD_TESTS=OFF -DPVX_BUILD_BENCH=OFF -DPVX_BUILD_DEMO=ON -DPVX_SANITIZE=OFF
 cmake --build build-demo -j"$jobs" --target pvx_demo
 ./build-demo/demo/pvx_demo "$out"
 echo
