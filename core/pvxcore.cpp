@@ -63,25 +63,35 @@ Pvx64u DetectFeatures()
     return f;
 }
 
-// Largest cache from the deterministic cache parameters (leaf 4), with the
-// C runtime's view as a fallback for processors that lack the leaf.
+// Largest data or unified cache described by a deterministic cache-parameters
+// leaf: 4 on Intel, 0x8000001D on AMD (same layout); 0 when the leaf is absent.
+long long LargestCacheOfLeaf(unsigned leaf)
+{
+    unsigned maxLeaf = Query(leaf & 0x80000000u).a;
+    if (maxLeaf < leaf) return 0;
+    long long best = 0;
+    for (unsigned i = 0; i < 16; ++i) {
+        CpuId r = Query(leaf, i);
+        unsigned type = r.a & 0x1f;
+        if (type == 0) break;
+        if (type == 2) continue;  // instruction cache
+        long long ways = ((r.b >> 22) & 0x3ff) + 1;
+        long long parts = ((r.b >> 12) & 0x3ff) + 1;
+        long long line = (r.b & 0xfff) + 1;
+        long long sets = static_cast<long long>(r.c) + 1;
+        long long size = ways * parts * line * sets;
+        if (size > best) best = size;
+    }
+    return best;
+}
+
+// The processor's own description first; the C runtime's view only when the
+// processor has neither leaf (it overstates the last-level cache on some
+// machines).
 long long DetectMaxCache()
 {
-    long long best = 0;
-    if (Query(0).a >= 4) {
-        for (unsigned i = 0; i < 16; ++i) {
-            CpuId r = Query(4, i);
-            unsigned type = r.a & 0x1f;
-            if (type == 0) break;
-            if (type == 2) continue;  // instruction cache
-            long long ways = ((r.b >> 22) & 0x3ff) + 1;
-            long long parts = ((r.b >> 12) & 0x3ff) + 1;
-            long long line = (r.b & 0xfff) + 1;
-            long long sets = static_cast<long long>(r.c) + 1;
-            long long size = ways * parts * line * sets;
-            if (size > best) best = size;
-        }
-    }
+    long long best = LargestCacheOfLeaf(4);
+    if (best == 0) best = LargestCacheOfLeaf(0x8000001Du);
     if (best == 0) {
         const int names[] = {_SC_LEVEL4_CACHE_SIZE, _SC_LEVEL3_CACHE_SIZE, _SC_LEVEL2_CACHE_SIZE,
                              _SC_LEVEL1_DCACHE_SIZE};
