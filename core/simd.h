@@ -56,6 +56,8 @@ inline VI AndNot(VI notThis, VI b) { return _mm_andnot_si128(notThis, b); }
 // Bytes of b where the mask byte's top bit is set, else bytes of a.
 inline VI SelectBytes(VI a, VI b, VI mask) { return _mm_blendv_epi8(a, b, mask); }
 inline VI ShuffleBytes(VI v, VI idx) { return _mm_shuffle_epi8(v, idx); }
+// One bit per byte: the top bit of each byte, byte 0 in bit 0.
+inline int MoveMask8(VI v) { return _mm_movemask_epi8(v); }
 
 // ---- integer arithmetic ----
 inline VI AddSatU8(VI a, VI b) { return _mm_adds_epu8(a, b); }
