@@ -97,16 +97,34 @@ struct Replicate {
     static constexpr int Src(int g) { return g / C; }
 };
 
-// The shuffles of a map, computed once at compile time. For output vector o:
-// direct (input o unchanged), or the OR of pshufb of every input that
-// contributes; keep marks the destination bytes that are kept. tail lists the
-// elements of pixel 0 (stream and offset on each side) for the scalar tail.
+// The shuffles of a map, computed once at compile time, with the cheapest of
+// three ways to build each output vector (counting pshufb, por and pblendvb
+// as one instruction each):
+//   kOrShuffles     OR of one pshufb per contributing input;
+//   kBlendShuffle   blend the contributing inputs first, then one pshufb
+//                   (when they take bytes from distinct positions:
+//                   deinterleaving);
+//   kShuffleBlend   one pshufb per input shared by every output, then blends
+//                   (when each input lands on the same positions in every
+//                   output: interleaving three planes).
+// direct marks an output that is input o unchanged (channel blends); keep
+// marks the destination bytes that are kept. tail lists the elements of
+// pixel 0 (stream and offset on each side) for the scalar tail.
+enum class Plan { kOrShuffles, kBlendShuffle, kShuffleBlend };
+
 struct MoveTable {
-    alignas(16) std::int8_t idx[4][4][16];
-    alignas(16) std::int8_t keep[4][16];
+    alignas(16) std::int8_t idx[4][4][16];    // [o][q]: pshufb of input q for output o
+    alignas(16) std::int8_t keep[4][16];      // [o]: destination bytes kept
+    alignas(16) std::int8_t sel[4][4][16];    // [o][q]: bytes that output o takes from input q
+    alignas(16) std::int8_t pos[4][4][16];    // [o][q]: input positions of q that output o takes
+    alignas(16) std::int8_t one[4][16];       // [o]: kBlendShuffle: the pshufb after the blend
+    alignas(16) std::int8_t shared[4][16];    // [q]: kShuffleBlend: the one pshufb of input q
     bool used[4][4];
     bool direct[4];
     bool keeps[4];
+    bool blendFirst[4];  // [o]: kBlendShuffle chosen for output o
+    bool sharedUsed[4];
+    Plan plan;
     struct Elem {
         int os, ob, is, ib;
     } tail[16];
@@ -117,6 +135,7 @@ template <class M>
 constexpr MoveTable BuildMoveTable()
 {
     MoveTable t{};
+    int costPerOutput = 0;
     for (int o = 0; o < M::kOut; ++o) {
         bool direct = true;
         for (int j = 0; j < 16; ++j) {
@@ -127,11 +146,58 @@ constexpr MoveTable BuildMoveTable()
             for (int q = 0; q < M::kIn; ++q) {
                 bool from = s >= 0 && s / 16 == q;
                 t.idx[o][q][j] = from ? static_cast<std::int8_t>(s % 16) : static_cast<std::int8_t>(-128);
+                t.sel[o][q][j] = from ? -1 : 0;
                 if (from) t.used[o][q] = true;
             }
         }
         t.direct[o] = direct && o < M::kIn;
+        int n = 0;
+        for (int q = 0; q < M::kIn; ++q) n += t.used[o][q];
+        if (t.direct[o]) continue;
+        // blend first: the positions that the inputs give must not collide
+        bool distinct = true;
+        int taken[16] = {};
+        for (int j = 0; j < 16; ++j) t.one[o][j] = -128;
+        for (int q = 0; q < M::kIn; ++q) {
+            bool mine[16] = {};
+            for (int j = 0; j < 16; ++j)
+                if (t.idx[o][q][j] >= 0) mine[t.idx[o][q][j]] = true;
+            for (int p = 0; p < 16; ++p) {
+                t.pos[o][q][p] = mine[p] ? -1 : 0;
+                if (mine[p]) distinct = distinct && taken[p]++ == 0;
+            }
+        }
+        for (int j = 0; j < 16; ++j)
+            for (int q = 0; q < M::kIn; ++q)
+                if (t.idx[o][q][j] >= 0) t.one[o][j] = t.idx[o][q][j];
+        t.blendFirst[o] = distinct && n > 1;
+        costPerOutput += t.blendFirst[o] ? n : 2 * n - 1;
     }
+    // shuffle first: one pshufb per input must serve every output
+    bool consistent = true;
+    for (int q = 0; q < M::kIn; ++q)
+        for (int j = 0; j < 16; ++j) t.shared[q][j] = -128;
+    int costShared = 0;
+    for (int o = 0; o < M::kOut; ++o) {
+        if (t.direct[o]) continue;
+        int n = 0;
+        for (int q = 0; q < M::kIn; ++q) {
+            if (!t.used[o][q]) continue;
+            ++n;
+            t.sharedUsed[q] = true;
+            for (int j = 0; j < 16; ++j) {
+                std::int8_t b = t.idx[o][q][j];
+                if (b < 0) continue;
+                if (t.shared[q][j] >= 0 && t.shared[q][j] != b) consistent = false;
+                t.shared[q][j] = b;
+            }
+        }
+        costShared += n - 1;
+    }
+    for (int q = 0; q < M::kIn; ++q) costShared += t.sharedUsed[q];
+    if (consistent && costShared < costPerOutput) t.plan = Plan::kShuffleBlend;
+    else t.plan = Plan::kOrShuffles;  // per output: blendFirst or OR of shuffles
+
     // pixel 0: output elements and the input elements they take
     int n = 0;
     int outStreams = M::kOutPlanar ? M::kOut : 1;
@@ -187,13 +253,31 @@ inline void MoveBlock(const Byte* const* in, Byte* const* out, std::ptrdiff_t x,
         if constexpr (kConst) v[q] = pat[q];
         else v[q] = LoadU(M::kInPlanar ? in[q] + x * M::kS : in[0] + x * M::kInPix + 16 * q);
     }
+    VI sh[M::kIn];
+    if constexpr (T.plan == Plan::kShuffleBlend)
+        for (int q = 0; q < M::kIn; ++q)
+            if (T.sharedUsed[q]) sh[q] = ShuffleBytes(v[q], LoadA(T.shared[q]));
     for (int o = 0; o < M::kOut; ++o) {
         Byte* d = M::kOutPlanar ? out[o] + x * M::kS : out[0] + x * M::kOutPix + 16 * o;
-        VI r;
+        VI r = Zero();
         if (T.direct[o]) {
             r = v[o];
+        } else if (T.plan == Plan::kShuffleBlend) {
+            bool first = true;
+            for (int q = 0; q < M::kIn; ++q) {
+                if (!T.used[o][q]) continue;
+                r = first ? sh[q] : SelectBytes(r, sh[q], LoadA(T.sel[o][q]));
+                first = false;
+            }
+        } else if (T.blendFirst[o]) {
+            bool first = true;
+            for (int q = 0; q < M::kIn; ++q) {
+                if (!T.used[o][q]) continue;
+                r = first ? v[q] : SelectBytes(r, v[q], LoadA(T.pos[o][q]));
+                first = false;
+            }
+            r = ShuffleBytes(r, LoadA(T.one[o]));
         } else {
-            r = Zero();
             for (int q = 0; q < M::kIn; ++q)
                 if (T.used[o][q]) r = Or(r, ShuffleBytes(v[q], LoadA(T.idx[o][q])));
         }
@@ -222,9 +306,16 @@ inline std::ptrdiff_t StreamStart(Byte* const* out)
 // where the output streams can be aligned; the unaligned head and the tail go
 // through the scalar path, and the caller fences after its last row.
 template <class M, bool kConst = false, bool kNt = false>
-void MoveRow(const Byte* const* in, Byte* const* out, std::ptrdiff_t w, const VI* pat = nullptr,
+void MoveRow(const Byte* const* inStreams, Byte* const* outStreams, std::ptrdiff_t w, const VI* pat = nullptr,
              const Byte* patBytes = nullptr)
 {
+    // Local copies: stores through the rows cannot alias them, so the
+    // pointers stay in registers.
+    const Byte* in[4] = {};
+    Byte* out[4] = {};
+    if constexpr (!kConst)
+        for (int s = 0; s < (M::kInPlanar ? M::kIn : 1); ++s) in[s] = inStreams[s];
+    for (int s = 0; s < (M::kOutPlanar ? M::kOut : 1); ++s) out[s] = outStreams[s];
     constexpr std::ptrdiff_t kN = 16 / M::kS;
     const std::ptrdiff_t end = M::kShort ? w - 1 : w;
     std::ptrdiff_t x = 0;

@@ -1,5 +1,6 @@
 // Set: every member against a scalar reference on guarded images, the check
 // order, zero steps, 32f bit patterns and large streamed fills.
+#include <algorithm>
 #include <cstdint>
 #include <cstring>
 #include <vector>
@@ -78,11 +79,13 @@ void FillMask(GuardedImage& mask, int mode, Rng& rng)
     mask.Snapshot();
 }
 
-// Random value bytes; 4-byte members get NaN bit patterns now and then.
+// Random value bytes, sometimes one repeated byte; 4-byte members get NaN
+// bit patterns now and then.
 std::vector<Pvx8u> RandomValue(const Member& m, Rng& rng)
 {
     std::vector<Pvx8u> v(4 * m.elemBytes);
     for (auto& b : v) b = static_cast<Pvx8u>(rng());
+    if (RandInt(rng, 0, 3) == 0) std::fill(v.begin(), v.end(), v[0]);  // 0, -1, 0x0101...: one repeated byte
     const std::uint32_t nans[] = {0x7f800001u, 0xffc12345u};
     if (m.elemBytes == 4 && RandInt(rng, 0, 2) == 0) std::memcpy(&v[0], &nans[RandInt(rng, 0, 1)], 4);
     return v;
