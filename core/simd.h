@@ -56,6 +56,18 @@ inline VI AndNot(VI notThis, VI b) { return _mm_andnot_si128(notThis, b); }
 // Bytes of b where the mask byte's top bit is set, else bytes of a.
 inline VI SelectBytes(VI a, VI b, VI mask) { return _mm_blendv_epi8(a, b, mask); }
 inline VI ShuffleBytes(VI v, VI idx) { return _mm_shuffle_epi8(v, idx); }
+// One bit per byte: the top bit of each byte, byte 0 in bit 0.
+inline int MoveMask8(VI v) { return _mm_movemask_epi8(v); }
+// Transposes four vectors seen as rows of four 32-bit lanes.
+inline void Transpose4x32(VI& a, VI& b, VI& c, VI& d)
+{
+    VI t0 = _mm_unpacklo_epi32(a, b), t1 = _mm_unpacklo_epi32(c, d);
+    VI t2 = _mm_unpackhi_epi32(a, b), t3 = _mm_unpackhi_epi32(c, d);
+    a = _mm_unpacklo_epi64(t0, t1);
+    b = _mm_unpackhi_epi64(t0, t1);
+    c = _mm_unpacklo_epi64(t2, t3);
+    d = _mm_unpackhi_epi64(t2, t3);
+}
 
 // ---- integer arithmetic ----
 inline VI AddSatU8(VI a, VI b) { return _mm_adds_epu8(a, b); }

@@ -1,0 +1,502 @@
+// Row kernels of the bit-exact data-movement families (Copy, Set, Dup): every
+// element is moved as a bit pattern in integer registers, so 32f NaNs keep
+// their payload. Kernels depend on the element size only; 16s and 16u, 32s
+// and 32f share them.
+//
+// Three engines:
+//   MoveRow    a fixed byte permutation of blocks of 16 / S pixels between
+//              interleaved and planar streams, optionally keeping some
+//              destination bytes (channel blends) or taking a constant
+//              pattern as the source;
+//   MaskRow    a masked copy or fill of 16 pixels a step, the mask byte
+//              expanded to the pixel width;
+//   FillRow    a fill with a replicated pattern whose period divides 48.
+//
+// Loads and stores are movdqu on every row: on aligned addresses it runs as
+// fast as movdqa (measured on 600 KB and 6 MB fills), so an aligned path per
+// row would double the kernels for nothing. Only the streamed stores need
+// aligned addresses, and they get them from a scalar or overlapping head.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <cstring>
+
+#include "simd.h"
+
+namespace pvx::move {
+
+using namespace simd;
+using Byte = std::uint8_t;
+
+// ---- MoveRow ------------------------------------------------------------------
+//
+// A map describes one block of N = 16 / S pixels. The input side has kIn
+// vectors and the output side kOut; a planar side has one vector per plane
+// (one stream each), an interleaved side one stream of consecutive vectors.
+// Src(g) gives the input byte (global index q * 16 + j) that output byte g
+// (o * 16 + j) takes, or -1 where the destination byte is kept. kShort: a
+// pointer addresses one channel of a multi-channel pixel, so the last pixel
+// of a row ends S bytes after it and blocks stop one pixel early.
+
+template <int S, int C>  // interleaved C channels -> C planes
+struct Deinterleave {
+    static constexpr int kS = S, kIn = C, kOut = C, kInPix = C * S, kOutPix = S;
+    static constexpr bool kInPlanar = false, kOutPlanar = true, kShort = false, kQuad = C == 4;
+    static constexpr int Src(int g) { return ((g % 16) / S) * C * S + (g / 16) * S + g % S; }
+};
+
+template <int S, int C>  // C planes -> interleaved C channels
+struct Interleave {
+    static constexpr int kS = S, kIn = C, kOut = C, kInPix = S, kOutPix = C * S;
+    static constexpr bool kInPlanar = true, kOutPlanar = false, kShort = false, kQuad = C == 4;
+    static constexpr int Src(int g) { return ((g / S) % C) * 16 + (g / (C * S)) * S + g % S; }
+};
+
+template <int S, int C>  // one channel of C (pointer at the channel) -> one channel
+struct Extract {
+    static constexpr int kS = S, kIn = C, kOut = 1, kInPix = C * S, kOutPix = S;
+    static constexpr bool kInPlanar = false, kOutPlanar = false, kShort = true;
+    static constexpr int Src(int g) { return (g / S) * C * S + g % S; }
+};
+
+template <int S, int C>  // one channel -> one channel of C (pointer at the channel)
+struct Insert {
+    static constexpr int kS = S, kIn = 1, kOut = C, kInPix = S, kOutPix = C * S;
+    static constexpr bool kInPlanar = false, kOutPlanar = false, kShort = true;
+    static constexpr int Src(int g) { return g % (C * S) < S ? (g / (C * S)) * S + g % (C * S) : -1; }
+};
+
+template <int S, int C>  // one channel to the same channel (both pointers at it)
+struct Channel {
+    static constexpr int kS = S, kIn = C, kOut = C, kInPix = C * S, kOutPix = C * S;
+    static constexpr bool kInPlanar = false, kOutPlanar = false, kShort = true;
+    static constexpr int Src(int g) { return g % (C * S) < S ? g : -1; }
+};
+
+template <int S>  // four channels, the destination's fourth kept
+struct KeepAlpha {
+    static constexpr int kS = S, kIn = 4, kOut = 4, kInPix = 4 * S, kOutPix = 4 * S;
+    static constexpr bool kInPlanar = false, kOutPlanar = false, kShort = false;
+    static constexpr int Src(int g) { return g % (4 * S) < 3 * S ? g : -1; }
+};
+
+template <int S>  // three channels -> four, the destination's fourth kept
+struct ThreeToAlpha {
+    static constexpr int kS = S, kIn = 3, kOut = 4, kInPix = 3 * S, kOutPix = 4 * S;
+    static constexpr bool kInPlanar = false, kOutPlanar = false, kShort = false;
+    static constexpr int Src(int g) { return (g / S) % 4 < 3 ? (g / (4 * S)) * 3 * S + g % (4 * S) : -1; }
+};
+
+template <int S>  // four channels -> three
+struct AlphaToThree {
+    static constexpr int kS = S, kIn = 4, kOut = 3, kInPix = 4 * S, kOutPix = 3 * S;
+    static constexpr bool kInPlanar = false, kOutPlanar = false, kShort = false;
+    static constexpr int Src(int g) { return (g / (3 * S)) * 4 * S + g % (3 * S); }
+};
+
+template <int C>  // one 8-bit channel -> every channel of C
+struct Replicate {
+    static constexpr int kS = 1, kIn = 1, kOut = C, kInPix = 1, kOutPix = C;
+    static constexpr bool kInPlanar = false, kOutPlanar = false, kShort = false;
+    static constexpr int Src(int g) { return g / C; }
+};
+
+// The shuffles of a map, computed once at compile time, with the cheapest of
+// three ways to build each output vector (counting pshufb, por and pblendvb
+// as one instruction each):
+//   kOrShuffles     OR of one pshufb per contributing input;
+//   kBlendShuffle   blend the contributing inputs first, then one pshufb
+//                   (when they take bytes from distinct positions:
+//                   deinterleaving);
+//   kShuffleBlend   one pshufb per input shared by every output, then blends
+//                   (when each input lands on the same positions in every
+//                   output: interleaving three planes).
+// direct marks an output that is input o unchanged (channel blends); keep
+// marks the destination bytes that are kept. tail lists the elements of
+// pixel 0 (stream and offset on each side) for the scalar tail.
+enum class Plan { kOrShuffles, kBlendShuffle, kShuffleBlend };
+
+struct MoveTable {
+    alignas(16) std::int8_t idx[4][4][16];    // [o][q]: pshufb of input q for output o
+    alignas(16) std::int8_t keep[4][16];      // [o]: destination bytes kept
+    alignas(16) std::int8_t sel[4][4][16];    // [o][q]: bytes that output o takes from input q
+    alignas(16) std::int8_t pos[4][4][16];    // [o][q]: input positions of q that output o takes
+    alignas(16) std::int8_t one[4][16];       // [o]: kBlendShuffle: the pshufb after the blend
+    alignas(16) std::int8_t shared[4][16];    // [q]: kShuffleBlend: the one pshufb of input q
+    bool used[4][4];
+    bool direct[4];
+    bool keeps[4];
+    bool blendFirst[4];  // [o]: kBlendShuffle chosen for output o
+    bool sharedUsed[4];
+    Plan plan;
+    struct Elem {
+        int os, ob, is, ib;
+    } tail[16];
+    int nTail;
+};
+
+template <class M>
+constexpr MoveTable BuildMoveTable()
+{
+    MoveTable t{};
+    int costPerOutput = 0;
+    for (int o = 0; o < M::kOut; ++o) {
+        bool direct = true;
+        for (int j = 0; j < 16; ++j) {
+            int s = M::Src(o * 16 + j);
+            t.keep[o][j] = s < 0 ? -1 : 0;
+            if (s < 0) t.keeps[o] = true;
+            if (s >= 0 && s != o * 16 + j) direct = false;
+            for (int q = 0; q < M::kIn; ++q) {
+                bool from = s >= 0 && s / 16 == q;
+                t.idx[o][q][j] = from ? static_cast<std::int8_t>(s % 16) : static_cast<std::int8_t>(-128);
+                t.sel[o][q][j] = from ? -1 : 0;
+                if (from) t.used[o][q] = true;
+            }
+        }
+        t.direct[o] = direct && o < M::kIn;
+        int n = 0;
+        for (int q = 0; q < M::kIn; ++q) n += t.used[o][q];
+        if (t.direct[o]) continue;
+        // blend first: the positions that the inputs give must not collide
+        bool distinct = true;
+        int taken[16] = {};
+        for (int j = 0; j < 16; ++j) t.one[o][j] = -128;
+        for (int q = 0; q < M::kIn; ++q) {
+            bool mine[16] = {};
+            for (int j = 0; j < 16; ++j)
+                if (t.idx[o][q][j] >= 0) mine[t.idx[o][q][j]] = true;
+            for (int p = 0; p < 16; ++p) {
+                t.pos[o][q][p] = mine[p] ? -1 : 0;
+                if (mine[p]) distinct = distinct && taken[p]++ == 0;
+            }
+        }
+        for (int j = 0; j < 16; ++j)
+            for (int q = 0; q < M::kIn; ++q)
+                if (t.idx[o][q][j] >= 0) t.one[o][j] = t.idx[o][q][j];
+        t.blendFirst[o] = distinct && n > 1;
+        costPerOutput += t.blendFirst[o] ? n : 2 * n - 1;
+    }
+    // shuffle first: one pshufb per input must serve every output
+    bool consistent = true;
+    for (int q = 0; q < M::kIn; ++q)
+        for (int j = 0; j < 16; ++j) t.shared[q][j] = -128;
+    int costShared = 0;
+    for (int o = 0; o < M::kOut; ++o) {
+        if (t.direct[o]) continue;
+        int n = 0;
+        for (int q = 0; q < M::kIn; ++q) {
+            if (!t.used[o][q]) continue;
+            ++n;
+            t.sharedUsed[q] = true;
+            for (int j = 0; j < 16; ++j) {
+                std::int8_t b = t.idx[o][q][j];
+                if (b < 0) continue;
+                if (t.shared[q][j] >= 0 && t.shared[q][j] != b) consistent = false;
+                t.shared[q][j] = b;
+            }
+        }
+        costShared += n - 1;
+    }
+    for (int q = 0; q < M::kIn; ++q) costShared += t.sharedUsed[q];
+    if (consistent && costShared < costPerOutput) t.plan = Plan::kShuffleBlend;
+    else t.plan = Plan::kOrShuffles;  // per output: blendFirst or OR of shuffles
+
+    // pixel 0: output elements and the input elements they take
+    int n = 0;
+    int outStreams = M::kOutPlanar ? M::kOut : 1;
+    int perStream = M::kOutPlanar ? M::kS : M::kOutPix;
+    for (int os = 0; os < outStreams; ++os) {
+        for (int ob = 0; ob < perStream; ob += M::kS) {
+            int g = M::kOutPlanar ? os * 16 + ob : ob;
+            int s = M::Src(g);
+            if (s < 0) continue;
+            int is = M::kInPlanar ? s / 16 : 0;
+            int ib = M::kInPlanar ? s % 16 : s;
+            t.tail[n++] = {os, ob, is, ib};
+        }
+    }
+    t.nTail = n;
+    return t;
+}
+
+template <class M>
+inline constexpr MoveTable kMoveTable = BuildMoveTable<M>();
+
+template <int S>
+inline void CopyElem(Byte* d, const Byte* s)
+{
+    std::memcpy(d, s, S);
+}
+
+// Pixels [x0, x1) one element at a time. kConst: the input is a pattern of
+// one pixel (pat holds the bytes of pixel 0 of every input stream).
+template <class M, bool kConst>
+inline void MoveScalar(const Byte* const* in, Byte* const* out, std::ptrdiff_t x0, std::ptrdiff_t x1,
+                       const Byte* pat)
+{
+    constexpr const MoveTable& T = kMoveTable<M>;
+    for (std::ptrdiff_t x = x0; x < x1; ++x) {
+        for (int k = 0; k < T.nTail; ++k) {
+            const MoveTable::Elem& e = T.tail[k];
+            const Byte* s = kConst ? pat + e.ib : in[e.is] + x * M::kInPix + e.ib;
+            CopyElem<M::kS>(out[e.os] + x * M::kOutPix + e.ob, s);
+        }
+    }
+}
+
+// Four channels to four planes and back as a 4x4 transpose of 32-bit lanes:
+// within a 16-byte vector of interleaved pixels, group[] gathers each
+// channel into one lane (c * 4 + p * S + e <- p * 4 S + c * S + e) and
+// ungroup[] undoes it; 4-byte elements need neither. 12 instructions per 64
+// bytes where the per-output shuffles take 28.
+template <class M>
+constexpr bool IsQuad()
+{
+    if constexpr (requires { M::kQuad; }) return M::kQuad;
+    else return false;
+}
+
+template <int S>
+struct QuadTable {
+    alignas(16) std::int8_t group[16];
+    alignas(16) std::int8_t ungroup[16];
+    constexpr QuadTable() : group{}, ungroup{}
+    {
+        for (int p = 0; p < 4 / S; ++p)
+            for (int c = 0; c < 4; ++c)
+                for (int e = 0; e < S; ++e) {
+                    group[c * 4 + p * S + e] = static_cast<std::int8_t>(p * 4 * S + c * S + e);
+                    ungroup[p * 4 * S + c * S + e] = static_cast<std::int8_t>(c * 4 + p * S + e);
+                }
+    }
+};
+
+template <int S>
+inline constexpr QuadTable<S> kQuadTable{};
+
+// One block of N pixels at pixel x: loads every input vector, builds every
+// output vector by shuffles (or takes it unchanged), blends in the kept
+// destination bytes, and stores.
+template <class M, bool kConst, bool kStream>
+inline void MoveBlock(const Byte* const* in, Byte* const* out, std::ptrdiff_t x, const VI* pat)
+{
+    constexpr const MoveTable& T = kMoveTable<M>;
+    VI v[M::kIn];
+    for (int q = 0; q < M::kIn; ++q) {
+        if constexpr (kConst) v[q] = pat[q];
+        else v[q] = LoadU(M::kInPlanar ? in[q] + x * M::kS : in[0] + x * M::kInPix + 16 * q);
+    }
+    if constexpr (IsQuad<M>()) {
+        constexpr const QuadTable<M::kS>& Q = kQuadTable<M::kS>;
+        if constexpr (!M::kInPlanar && M::kS < 4)
+            for (int q = 0; q < 4; ++q) v[q] = ShuffleBytes(v[q], LoadA(Q.group));
+        Transpose4x32(v[0], v[1], v[2], v[3]);
+        if constexpr (M::kInPlanar && M::kS < 4)
+            for (int q = 0; q < 4; ++q) v[q] = ShuffleBytes(v[q], LoadA(Q.ungroup));
+        for (int o = 0; o < 4; ++o) {
+            Byte* d = M::kOutPlanar ? out[o] + x * M::kS : out[0] + x * M::kOutPix + 16 * o;
+            if constexpr (kStream) StoreNt(d, v[o]);
+            else StoreU(d, v[o]);
+        }
+        return;
+    }
+    VI sh[M::kIn];
+    if constexpr (T.plan == Plan::kShuffleBlend)
+        for (int q = 0; q < M::kIn; ++q)
+            if (T.sharedUsed[q]) sh[q] = ShuffleBytes(v[q], LoadA(T.shared[q]));
+    for (int o = 0; o < M::kOut; ++o) {
+        Byte* d = M::kOutPlanar ? out[o] + x * M::kS : out[0] + x * M::kOutPix + 16 * o;
+        VI r = Zero();
+        if (T.direct[o]) {
+            r = v[o];
+        } else if (T.plan == Plan::kShuffleBlend) {
+            bool first = true;
+            for (int q = 0; q < M::kIn; ++q) {
+                if (!T.used[o][q]) continue;
+                r = first ? sh[q] : SelectBytes(r, sh[q], LoadA(T.sel[o][q]));
+                first = false;
+            }
+        } else if (T.blendFirst[o]) {
+            bool first = true;
+            for (int q = 0; q < M::kIn; ++q) {
+                if (!T.used[o][q]) continue;
+                r = first ? v[q] : SelectBytes(r, v[q], LoadA(T.pos[o][q]));
+                first = false;
+            }
+            r = ShuffleBytes(r, LoadA(T.one[o]));
+        } else {
+            for (int q = 0; q < M::kIn; ++q)
+                if (T.used[o][q]) r = Or(r, ShuffleBytes(v[q], LoadA(T.idx[o][q])));
+        }
+        if (T.keeps[o]) r = SelectBytes(r, LoadU(d), LoadA(T.keep[o]));
+        if constexpr (kStream) StoreNt(d, r);
+        else StoreU(d, r);
+    }
+}
+
+// First pixel from which every output stream is 16-byte aligned (so that
+// blocks can be streamed), or -1 when no pixel within a block gets there.
+template <class M>
+inline std::ptrdiff_t StreamStart(Byte* const* out)
+{
+    auto addr = [](const Byte* p) { return reinterpret_cast<std::uintptr_t>(p); };
+    constexpr int kStreams = M::kOutPlanar ? M::kOut : 1;
+    constexpr int kStride = M::kOutPlanar ? M::kS : M::kOutPix;
+    for (int s = 1; s < kStreams; ++s)
+        if ((addr(out[s]) - addr(out[0])) % 16 != 0) return -1;
+    for (int h = 0; h < 16; ++h)
+        if ((addr(out[0]) + static_cast<std::uintptr_t>(h) * kStride) % 16 == 0) return h;
+    return -1;
+}
+
+// Moves w pixels of one row. kNt: stream the output (non-temporal stores)
+// where the output streams can be aligned; the unaligned head and the tail go
+// through the scalar path, and the caller fences after its last row.
+template <class M, bool kConst = false, bool kNt = false>
+void MoveRow(const Byte* const* inStreams, Byte* const* outStreams, std::ptrdiff_t w, const VI* pat = nullptr,
+             const Byte* patBytes = nullptr)
+{
+    // Local copies: stores through the rows cannot alias them, so the
+    // pointers stay in registers.
+    const Byte* in[4] = {};
+    Byte* out[4] = {};
+    if constexpr (!kConst)
+        for (int s = 0; s < (M::kInPlanar ? M::kIn : 1); ++s) in[s] = inStreams[s];
+    for (int s = 0; s < (M::kOutPlanar ? M::kOut : 1); ++s) out[s] = outStreams[s];
+    constexpr std::ptrdiff_t kN = 16 / M::kS;
+    const std::ptrdiff_t end = M::kShort ? w - 1 : w;
+    std::ptrdiff_t x = 0;
+    if constexpr (kNt) {
+        std::ptrdiff_t h = StreamStart<M>(out);
+        if (h >= 0 && h + kN <= end) {
+            MoveScalar<M, kConst>(in, out, 0, h, patBytes);
+            for (x = h; x + kN <= end; x += kN) MoveBlock<M, kConst, true>(in, out, x, pat);
+            MoveScalar<M, kConst>(in, out, x, w, patBytes);
+            return;
+        }
+    }
+    for (; x + kN <= end; x += kN) MoveBlock<M, kConst, false>(in, out, x, pat);
+    MoveScalar<M, kConst>(in, out, x, w, patBytes);
+}
+
+// The input vectors of one block when the input is a pixel pattern: byte j of
+// vector q is pattern byte (16 q + j) mod pixel bytes.
+template <class M>
+inline void PatternVectors(const Byte* pix, VI* pat)
+{
+    alignas(16) Byte b[16];
+    for (int q = 0; q < M::kIn; ++q) {
+        for (int j = 0; j < 16; ++j) b[j] = pix[(16 * q + j) % M::kInPix];
+        pat[q] = LoadA(b);
+    }
+}
+
+// ---- MaskRow --------------------------------------------------------------------
+
+// Byte j of expansion vector k picks the mask byte of the pixel that holds
+// byte 16 k + j of a block of 16 pixels of P bytes; alpha marks the fourth
+// channel of AC4 pixels.
+template <int S, int C, bool kAlpha>
+struct MaskTable {
+    static constexpr int P = C * S;
+    alignas(16) std::int8_t expand[P][16];
+    alignas(16) std::int8_t alpha[P][16];
+    constexpr MaskTable() : expand{}, alpha{}
+    {
+        for (int k = 0; k < P; ++k)
+            for (int j = 0; j < 16; ++j) {
+                expand[k][j] = static_cast<std::int8_t>((16 * k + j) / P);
+                alpha[k][j] = kAlpha && (16 * k + j) % P >= 3 * S ? -1 : 0;
+            }
+    }
+};
+
+template <int S, int C, bool kAlpha>
+inline constexpr MaskTable<S, C, kAlpha> kMaskTable{};
+
+// Writes pixel x of w where its mask byte is non-zero, 16 pixels a step
+// (blocks whose mask is all zero are skipped), scalar tail. kConst: the
+// source is a pattern: pat holds the P vectors of a block, patBytes one pixel.
+template <int S, int C, bool kAlpha, bool kConst>
+void MaskRow(const Byte* src, Byte* dst, const Byte* mask, std::ptrdiff_t w, const VI* pat = nullptr,
+             const Byte* patBytes = nullptr)
+{
+    constexpr int P = C * S;
+    constexpr int kWrite = kAlpha ? 3 * S : P;
+    constexpr const MaskTable<S, C, kAlpha>& T = kMaskTable<S, C, kAlpha>;
+    std::ptrdiff_t x = 0;
+    for (; x + 16 <= w; x += 16) {
+        VI off = EqU8(LoadU(mask + x), Zero());  // 0xff where the pixel is left
+        if (MoveMask8(off) == 0xffff) continue;
+        for (int k = 0; k < P; ++k) {
+            Byte* d = dst + x * P + 16 * k;
+            VI keep = ShuffleBytes(off, LoadA(T.expand[k]));
+            if constexpr (kAlpha) keep = Or(keep, LoadA(T.alpha[k]));
+            VI s = kConst ? pat[k] : LoadU(src + x * P + 16 * k);
+            StoreU(d, SelectBytes(s, LoadU(d), keep));
+        }
+    }
+    for (; x < w; ++x)
+        if (mask[x]) std::memcpy(dst + x * P, kConst ? patBytes : src + x * P, kWrite);
+}
+
+// The P vectors of a block of 16 pixels filled with one pixel value.
+template <int P>
+inline void BlockPattern(const Byte* pix, VI* pat)
+{
+    alignas(16) Byte b[16];
+    for (int k = 0; k < P; ++k) {
+        for (int j = 0; j < 16; ++j) b[j] = pix[(16 * k + j) % P];
+        pat[k] = LoadA(b);
+    }
+}
+
+// ---- FillRow ----------------------------------------------------------------------
+
+// A fill pattern: byte i of a row is bytes[i % 48] (the pixel size divides
+// 48), with 16 more bytes so that any phase can be loaded as one vector.
+struct FillPattern {
+    alignas(16) Byte bytes[64];
+};
+
+inline FillPattern MakeFillPattern(const Byte* pix, int pixelBytes)
+{
+    FillPattern p;
+    for (int i = 0; i < 64; ++i) p.bytes[i] = pix[i % pixelBytes];
+    return p;
+}
+
+// Fills n bytes. Rows of 64 bytes or less are one memcpy of the pattern.
+// Longer rows: one unaligned vector at the start, then aligned vectors from
+// the first 16-byte boundary (streamed when kNt), then one unaligned vector
+// that ends the row. The head and end vectors re-write bytes of the aligned
+// run with the same values, which a fill may do.
+template <bool kNt>
+void FillRow(Byte* d, std::ptrdiff_t n, const FillPattern& p)
+{
+    if (n <= 64) {
+        std::memcpy(d, p.bytes, static_cast<std::size_t>(n));
+        return;
+    }
+    const Byte* b = p.bytes;
+    StoreU(d, LoadA(b));
+    std::ptrdiff_t i = static_cast<std::ptrdiff_t>((0 - reinterpret_cast<std::uintptr_t>(d)) & 15);
+    int ph = static_cast<int>(i % 48);
+    VI v0 = LoadU(b + ph), v1 = LoadU(b + (ph + 16) % 48), v2 = LoadU(b + (ph + 32) % 48);
+    auto store = [d](std::ptrdiff_t at, VI v) {
+        if constexpr (kNt) StoreNt(d + at, v);
+        else StoreA(d + at, v);
+    };
+    for (; i + 48 <= n; i += 48) {
+        store(i, v0);
+        store(i + 16, v1);
+        store(i + 32, v2);
+    }
+    if (i + 16 <= n) { store(i, v0); i += 16; }
+    if (i + 16 <= n) { store(i, v1); i += 16; }
+    if (i < n) StoreU(d + n - 16, LoadU(b + (n - 16) % 48));
+}
+
+}  // namespace pvx::move

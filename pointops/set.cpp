@@ -1,0 +1,143 @@
+// Set: fills a region, one channel or a masked part of it with a constant,
+// bit-exact for every element type.
+#include "check.h"
+#include "entry.h"
+#include "layout.h"
+#include "move.h"
+#include "store.h"
+
+namespace pvx {
+namespace {
+
+using namespace simd;
+using move::Byte;
+
+// One pixel of the value: K elements, the rest of the pixel zero (the AC4
+// alpha and the other channels of a CR pixel are never written).
+template <class T, int C>
+struct Pixel {
+    alignas(16) Byte bytes[C * sizeof(T)] = {};
+    Pixel(const T* value, int k) { std::memcpy(bytes, value, k * sizeof(T)); }
+};
+
+// Plain fills: the value replicated over a 48-byte pattern and stored row by
+// row, one row when the step equals the row length. Regions of more than
+// 1048576 bytes that are at least as large as the largest cache are streamed.
+template <int C, class T>
+void FillRows(const T* value, Byte* dst, int dstStep, PvxiSize roi)
+{
+    constexpr int kP = C * sizeof(T);
+    Pixel<T, C> pix(value, C);
+    move::FillPattern pat = move::MakeFillPattern(pix.bytes, kP);
+    std::ptrdiff_t rowBytes = static_cast<std::ptrdiff_t>(roi.width) * kP;
+    int rows = roi.height;
+    bool nt = UseNonTemporal(rowBytes * rows, kNtThresholdSet);
+    if (RowsContiguous(rowBytes, {dstStep})) {
+        rowBytes *= rows;
+        rows = 1;
+    }
+    // A value whose bytes are all equal (every 8u C1 value, 0 of any type)
+    // is a memset, which the C runtime does with the widest stores the
+    // processor has; 16-byte stores reach only about 0.8 of that on regions
+    // that stay in the cache (measured on 1080p frames).
+    bool uniform = true;
+    for (int i = 1; i < kP; ++i) uniform = uniform && pix.bytes[i] == pix.bytes[0];
+    if (uniform && !nt) {
+        for (int y = 0; y < rows; ++y)
+            std::memset(RowAt(dst, dstStep, y), pix.bytes[0], static_cast<std::size_t>(rowBytes));
+        return;
+    }
+    if (nt) {
+        for (int y = 0; y < rows; ++y) move::FillRow<true>(RowAt(dst, dstStep, y), rowBytes, pat);
+        StoreFence();
+    } else {
+        for (int y = 0; y < rows; ++y) move::FillRow<false>(RowAt(dst, dstStep, y), rowBytes, pat);
+    }
+}
+
+// Fills that keep some destination bytes (AC4 alpha, the other channels of a
+// CR pixel). They read the destination, so they never stream.
+template <class M, int C, class T>
+void BlendRows(const T* value, int k, Byte* dst, int dstStep, PvxiSize roi)
+{
+    Pixel<T, C> pix(value, k);
+    VI pat[M::kIn];
+    move::PatternVectors<M>(pix.bytes, pat);
+    std::ptrdiff_t w = roi.width;
+    int rows = roi.height;
+    if (RowsContiguous(w * M::kOutPix, {dstStep})) {
+        w *= rows;
+        rows = 1;
+    }
+    Byte* out[1];
+    for (int y = 0; y < rows; ++y) {
+        out[0] = RowAt(dst, dstStep, y);
+        move::MoveRow<M, true>(nullptr, out, w, pat, pix.bytes);
+    }
+}
+
+template <class T, Lay L>
+PvxStatus SetArrayBody(const T* value, T* pDst, int dstStep, PvxiSize roi)
+{
+    if (PvxStatus s = CheckFrame<Order::kPtrSize>({value, pDst}, roi, {})) return s;
+    constexpr int kS = sizeof(T);
+    Byte* dst = reinterpret_cast<Byte*>(pDst);
+    if constexpr (L == Lay::C1) FillRows<1>(value, dst, dstStep, roi);
+    else if constexpr (L == Lay::C3) FillRows<3>(value, dst, dstStep, roi);
+    else if constexpr (L == Lay::C4) FillRows<4>(value, dst, dstStep, roi);
+    else if constexpr (L == Lay::AC4) BlendRows<move::KeepAlpha<kS>, 4>(value, 3, dst, dstStep, roi);
+    else if constexpr (L == Lay::C3CR) BlendRows<move::Channel<kS, 3>, 3>(value, 1, dst, dstStep, roi);
+    else BlendRows<move::Channel<kS, 4>, 4>(value, 1, dst, dstStep, roi);
+    return pvxStsNoErr;
+}
+
+// C1 and CR members take the value itself; the others an array of 3 or 4.
+template <class T, Lay L>
+PvxStatus SetBody(T value, T* pDst, int dstStep, PvxiSize roi)
+{
+    return SetArrayBody<T, L>(&value, pDst, dstStep, roi);
+}
+
+template <class T, Lay L>
+PvxStatus SetBody(const T* value, T* pDst, int dstStep, PvxiSize roi)
+{
+    return SetArrayBody<T, L>(value, pDst, dstStep, roi);
+}
+
+// Masked fill: the masked-copy kernel with a pattern as its source.
+template <class T, Lay L>
+PvxStatus SetMaskArrayBody(const T* value, T* pDst, int dstStep, PvxiSize roi, const Pvx8u* pMask, int maskStep)
+{
+    if (PvxStatus s = CheckFrame<Order::kPtrSize>({value, pDst, pMask}, roi, {})) return s;
+    constexpr int kS = sizeof(T), kC = kChannels<L>, kP = kS * kC;
+    Pixel<T, kC> pix(value, kProcessed<L>);
+    VI pat[kP];
+    move::BlockPattern<kP>(pix.bytes, pat);
+    std::ptrdiff_t w = roi.width;
+    int rows = roi.height;
+    if (RowsContiguous(w * kP, {dstStep}) && RowsContiguous(w, {maskStep})) {
+        w *= rows;
+        rows = 1;
+    }
+    for (int y = 0; y < rows; ++y)
+        move::MaskRow<kS, kC, kKeepsAlpha<L>, true>(nullptr, reinterpret_cast<Byte*>(RowAt(pDst, dstStep, y)),
+                                                    RowAt(pMask, maskStep, y), w, pat, pix.bytes);
+    return pvxStsNoErr;
+}
+
+template <class T, Lay L>
+PvxStatus SetMaskBody(T value, T* pDst, int dstStep, PvxiSize roi, const Pvx8u* pMask, int maskStep)
+{
+    return SetMaskArrayBody<T, L>(&value, pDst, dstStep, roi, pMask, maskStep);
+}
+
+template <class T, Lay L>
+PvxStatus SetMaskBody(const T* value, T* pDst, int dstStep, PvxiSize roi, const Pvx8u* pMask, int maskStep)
+{
+    return SetMaskArrayBody<T, L>(value, pDst, dstStep, roi, pMask, maskStep);
+}
+
+}  // namespace
+}  // namespace pvx
+
+#include "set.exports.inc"
