@@ -78,8 +78,19 @@ std::vector<Shape> ShapesFor(int sf, Rng& rng)
 // One type and layout of one operation: the two-image, in-place, constant and
 // constant in-place members. Sub is second minus first: its two-image forms
 // take x from the second image.
-template <class T, int C, int K, class F2, class FI, class FC, class FCI>
-void RunMembers(const char* name, Bin op, F2 two, FI inPlace, FC cst, FCI cstInPlace)
+template <class T>
+using TwoFn = PvxStatus (*)(const T*, int, const T*, int, T*, int, PvxiSize, int);
+template <class T>
+using InPlaceFn = PvxStatus (*)(const T*, int, T*, int, PvxiSize, int);
+template <class T>
+using ConstFn = PvxStatus (*)(const T*, int, const T*, T*, int, PvxiSize, int);
+template <class T>
+using ConstInPlaceFn = PvxStatus (*)(const T*, T*, int, PvxiSize, int);
+
+// C elements per pixel in memory, the first K of them processed.
+template <class T>
+void RunMembers(const char* name, Bin op, int C, int K, TwoFn<T> two, InPlaceFn<T> inPlace, ConstFn<T> cst,
+                ConstInPlaceFn<T> cstInPlace)
 {
     const bool swap = op == Bin::kSub;
     std::uint64_t seed = 0;
@@ -185,7 +196,7 @@ void RunMembers(const char* name, Bin op, F2 two, FI inPlace, FC cst, FCI cstInP
         EXPECT_TRUE(RegionEquals(d, Parts(want))) << "zero source steps";
         d.Snapshot();
         old = d.Packed<T>();
-        auto val = [&](std::size_t i) { return value[1 + i % C - (i % C)]; };
+        auto val = [&](std::size_t) { return value[1]; };
         T v1[4] = {value[1], value[1], value[1], value[1]};
         ASSERT_EQ(cst(pa, 0, v1, pd, sd, ok, sf), pvxStsNoErr);
         want = Expect(op, C, K, sf, old, at(r0a), val);
@@ -198,17 +209,17 @@ void RunMembers(const char* name, Bin op, F2 two, FI inPlace, FC cst, FCI cstInP
 #define ONE_VALUE *v
 #define VALUES v
 #define MEMBERS(OP, t, L, SFX, SFA, C, K, VAL)                                                                    \
-    RunMembers<Pvx##t, C, K>(                                                                                    \
-        "pvxi" #OP "_" #t "_" #L, Bin::k##OP,                                                                    \
-        [](const Pvx##t* a, int as, const Pvx##t* b, int bs, Pvx##t* d, int ds, PvxiSize r,                      \
+    RunMembers<Pvx##t>(                                                                                          \
+        "pvxi" #OP "_" #t "_" #L, Bin::k##OP, C, K,                                                              \
+        +[](const Pvx##t* a, int as, const Pvx##t* b, int bs, Pvx##t* d, int ds, PvxiSize r,                      \
            [[maybe_unused]] int sf) { return pvxi##OP##_##t##_##L##R##SFX(a, as, b, bs, d, ds, r SFA(sf)); },       \
-        [](const Pvx##t* a, int as, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {                    \
+        +[](const Pvx##t* a, int as, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {                    \
             return pvxi##OP##_##t##_##L##IR##SFX(a, as, d, ds, r SFA(sf));                                           \
         },                                                                                                       \
-        [](const Pvx##t* a, int as, const Pvx##t* v, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {   \
+        +[](const Pvx##t* a, int as, const Pvx##t* v, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {   \
             return pvxi##OP##C_##t##_##L##R##SFX(a, as, VAL, d, ds, r SFA(sf));                                      \
         },                                                                                                       \
-        [](const Pvx##t* v, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {                            \
+        +[](const Pvx##t* v, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {                            \
             return pvxi##OP##C_##t##_##L##IR##SFX(VAL, d, ds, r SFA(sf));                                            \
         })
 
@@ -232,6 +243,8 @@ void RunMembers(const char* name, Bin op, F2 two, FI inPlace, FC cst, FCI cstInP
     TEST(OP, Members32fc) { COMPLEX_MEMBERS(OP, 32fc, , NO_SF); }
 
 FAMILY_TESTS(Add)
+FAMILY_TESTS(Sub)
+FAMILY_TESTS(Mul)
 
 // ---- documented cases ----------------------------------------------------------
 
@@ -281,6 +294,48 @@ TEST(Add, ContiguousRowsGiveTheSameResult)
                                      {37, 1}, 2),
                   pvxStsNoErr);
     EXPECT_EQ(d1, d2);
+}
+
+TEST(Sub, SecondMinusFirst)
+{
+    Pvx8u a = 10, b = 3, d = 99;
+    ASSERT_EQ(pvxiSub_8u_C1RSfs(&a, 1, &b, 1, &d, 1, {1, 1}, 0), pvxStsNoErr);
+    EXPECT_EQ(d, 0);
+    ASSERT_EQ(pvxiSub_8u_C1RSfs(&b, 1, &a, 1, &d, 1, {1, 1}, 0), pvxStsNoErr);
+    EXPECT_EQ(d, 7);
+    Pvx8u sd = 10;
+    ASSERT_EQ(pvxiSub_8u_C1IRSfs(&b, 1, &sd, 1, {1, 1}, 0), pvxStsNoErr);
+    EXPECT_EQ(sd, 7);
+    ASSERT_EQ(pvxiSubC_8u_C1RSfs(&a, 1, 3, &d, 1, {1, 1}, 0), pvxStsNoErr);
+    EXPECT_EQ(d, 7);
+    Pvx32f fa = 1.5f, fb = 4.0f, fd = 0;
+    ASSERT_EQ(pvxiSub_32f_C1R(&fa, 4, &fb, 4, &fd, 4, {1, 1}), pvxStsNoErr);
+    EXPECT_EQ(fd, 2.5f);
+}
+
+TEST(Mul, ComplexProduct)
+{
+    Pvx16sc a{3, 4}, b{5, -2}, d{};
+    ASSERT_EQ(pvxiMul_16sc_C1RSfs(&a, 4, &b, 4, &d, 4, {1, 1}, 0), pvxStsNoErr);
+    EXPECT_EQ(d.re, 23);  // 15 + 8
+    EXPECT_EQ(d.im, 14);  // -6 + 20
+    Pvx32sc big{INT_MIN, INT_MIN}, e{};
+    ASSERT_EQ(pvxiMul_32sc_C1RSfs(&big, 8, &big, 8, &e, 8, {1, 1}, 62), pvxStsNoErr);
+    EXPECT_EQ(e.re, 0);  // 2^62 - 2^62
+    EXPECT_EQ(e.im, 2);  // 2^63 / 2^62
+    Pvx32fc fa{1.5f, -2.0f}, fb{4.0f, 0.25f}, fd{};
+    ASSERT_EQ(pvxiMulC_32fc_C1R(&fa, 8, fb, &fd, 8, {1, 1}), pvxStsNoErr);
+    EXPECT_EQ(fd.re, 6.5f);
+    EXPECT_EQ(fd.im, -7.625f);
+}
+
+TEST(Mul, ZeroFromScaleFactor17For8u)
+{
+    Pvx8u a = 255, d = 9;
+    ASSERT_EQ(pvxiMul_8u_C1RSfs(&a, 1, &a, 1, &d, 1, {1, 1}, 16), pvxStsNoErr);
+    EXPECT_EQ(d, 1);  // 65025 / 65536
+    ASSERT_EQ(pvxiMul_8u_C1RSfs(&a, 1, &a, 1, &d, 1, {1, 1}, 17), pvxStsNoErr);
+    EXPECT_EQ(d, 0);
 }
 
 }  // namespace
