@@ -25,7 +25,11 @@
 //   template <class T> static constexpr Wide MaxAbs();  bound of |exact result|
 //   static constexpr int kIdentity;      constant (re part for complex) that
 //                                        makes the op a copy at sf 0
-// and names ArithBody / ArithIBody / ArithCBody / ArithCIBody in its table.
+// and names ArithBody / ArithIBody / ArithCBody / ArithCIBody (or, for unary
+// families whose Op has Scalar(a) and Vec(a), ArithUBody / ArithUIBody) in its
+// table. Families with their own checks or statuses call RunRows from their
+// own bodies; an op that must report something per call (a zero divisor)
+// can carry a pointer to a flag: ArithRow copies the op, not what it points to.
 #pragma once
 
 #include <cstddef>
@@ -497,8 +501,17 @@ bool IsIdentity(const T* value)
     return true;
 }
 
+// The family's op for the second operand K: OpC for constants, else Op.
 template <class Fam, class T, Src2 K, Sf M>
-using OpOf = std::conditional_t<K == Src2::kConst, typename Fam::template OpC<T, M>, typename Fam::template Op<T, M>>;
+struct OpOfT {
+    using type = typename Fam::template Op<T, M>;
+};
+template <class Fam, class T, Sf M>
+struct OpOfT<Fam, T, Src2::kConst, M> {
+    using type = typename Fam::template OpC<T, M>;
+};
+template <class Fam, class T, Src2 K, Sf M>
+using OpOf = typename OpOfT<Fam, T, K, M>::type;
 template <class Op>
 concept HalfPathOp = requires { requires Op::kHalfPath; };
 
@@ -509,13 +522,8 @@ PvxStatus ArithRun(const T* a, int aStep, const T* b, int bStep, T* d, int dStep
                    const T* value)
 {
     auto run = [&]<Sf M>() {
-        if constexpr (K == Src2::kConst) {
-            using Op = typename Fam::template OpC<T, M>;
-            RunRows<T, L, K>(Op(sf), a, aStep, b, bStep, d, dStep, roi, value);
-        } else {
-            using Op = typename Fam::template Op<T, M>;
-            RunRows<T, L, K>(Op(sf), a, aStep, b, bStep, d, dStep, roi, value);
-        }
+        using Op = OpOf<Fam, T, K, M>;
+        RunRows<T, L, K>(Op(sf), a, aStep, b, bStep, d, dStep, roi, value);
     };
     if constexpr (std::is_floating_point_v<Element<T>>) {
         run.template operator()<Sf::kNone>();
@@ -623,6 +631,33 @@ template <class Fam, class T, Lay L, Order O>
 PvxStatus ArithCIBody(T value, T* pSrcDst, int srcDstStep, PvxiSize roi)
 {
     return ArithCIBody<Fam, T, L, O>(value, pSrcDst, srcDstStep, roi, 0);
+}
+
+// One image (unary families: Fam::Op has Scalar(a) and Vec(a)): d = op(src).
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({pSrc, pDst}, roi, {srcStep, dstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kNone>(pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi, scaleFactor, nullptr);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
+{
+    return ArithUBody<Fam, T, L, O>(pSrc, srcStep, pDst, dstStep, roi, 0);
+}
+
+// One image in place: srcDst = op(srcDst).
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUIBody(T* pSrcDst, int srcDstStep, PvxiSize roi, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({pSrcDst}, roi, {srcDstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kNone>(pSrcDst, srcDstStep, pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi,
+                                           scaleFactor, nullptr);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUIBody(T* pSrcDst, int srcDstStep, PvxiSize roi)
+{
+    return ArithUIBody<Fam, T, L, O>(pSrcDst, srcDstStep, roi, 0);
 }
 
 // The bound of |exact result| of the common operations on elements E.
