@@ -296,6 +296,62 @@ TEST(Add, ContiguousRowsGiveTheSameResult)
     EXPECT_EQ(d1, d2);
 }
 
+// Whole-region calls on contiguous rows (one merged row) equal row-by-row calls,
+// so constants keep their channel pattern and AC4 alpha across rows.
+template <class T, int C, class F>
+void ExpectMergedEqualsRows(F call)
+{
+    const int w = 37, h = 4, n = w * C;
+    Rng rng = MakeRng(11);
+    std::vector<T> a(n * h), b(n * h), d1(n * h), d2(n * h);
+    FillRandom(reinterpret_cast<ElemT<T>*>(a.data()), a.size() * Elem<T>::kParts, rng);
+    FillRandom(reinterpret_cast<ElemT<T>*>(b.data()), b.size() * Elem<T>::kParts, rng);
+    FillRandom(reinterpret_cast<ElemT<T>*>(d1.data()), d1.size() * Elem<T>::kParts, rng);
+    d2 = d1;
+    int step = n * static_cast<int>(sizeof(T));
+    ASSERT_EQ(call(a.data(), b.data(), d1.data(), step, PvxiSize{w, h}), pvxStsNoErr);
+    for (int y = 0; y < h; ++y)
+        ASSERT_EQ(call(a.data() + n * y, b.data() + n * y, d2.data() + n * y, step, PvxiSize{w, 1}), pvxStsNoErr);
+    EXPECT_EQ(std::memcmp(d1.data(), d2.data(), d1.size() * sizeof(T)), 0);
+}
+
+TEST(Arith, ContiguousRowsKeepPatternsAndAlpha)
+{
+    ExpectMergedEqualsRows<Pvx8u, 3>([](const Pvx8u* a, const Pvx8u*, Pvx8u* d, int st, PvxiSize r) {
+        const Pvx8u v[3] = {1, 200, 37};
+        return pvxiAddC_8u_C3RSfs(a, st, v, d, st, r, 1);
+    });
+    ExpectMergedEqualsRows<Pvx8u, 4>([](const Pvx8u* a, const Pvx8u* b, Pvx8u* d, int st, PvxiSize r) {
+        return pvxiMul_8u_AC4RSfs(a, st, b, st, d, st, r, 3);
+    });
+    ExpectMergedEqualsRows<Pvx32fc, 4>([](const Pvx32fc* a, const Pvx32fc*, Pvx32fc* d, int st, PvxiSize r) {
+        const Pvx32fc v[3] = {{1, 2}, {-3, 0.5f}, {7, 7}};
+        return pvxiSubC_32fc_AC4R(a, st, v, d, st, r);
+    });
+    ExpectMergedEqualsRows<Pvx16sc, 3>([](const Pvx16sc* a, const Pvx16sc*, Pvx16sc* d, int st, PvxiSize r) {
+        const Pvx16sc v[3] = {{1, 2}, {-3, 5}, {7, 7}};
+        return pvxiMulC_16sc_C3RSfs(a, st, v, d, st, r, 2);
+    });
+    ExpectMergedEqualsRows<Pvx16u, 3>([](const Pvx16u* a, const Pvx16u*, Pvx16u* d, int st, PvxiSize r) {
+        const Pvx16u v[3] = {0, 0, 0};
+        return pvxiSubC_16u_C3RSfs(a, st, v, d, st, r, 0);
+    });
+}
+
+TEST(Arith, NegativeStepsWalkUpwards)
+{
+    const int w = 21, h = 3;
+    Rng rng = MakeRng(12);
+    std::vector<Pvx8u> a(w * h), b(w * h), d(w * h), want(w * h);
+    FillRandom(a.data(), a.size(), rng);
+    FillRandom(b.data(), b.size(), rng);
+    ASSERT_EQ(pvxiSub_8u_C1RSfs(a.data() + w * (h - 1), -w, b.data() + w * (h - 1), -w, d.data() + w * (h - 1), -w,
+                                {w, h}, 0),
+              pvxStsNoErr);
+    for (int i = 0; i < w * h; ++i) want[i] = b[i] > a[i] ? b[i] - a[i] : 0;
+    EXPECT_EQ(d, want);
+}
+
 TEST(Sub, SecondMinusFirst)
 {
     Pvx8u a = 10, b = 3, d = 99;
