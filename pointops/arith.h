@@ -19,12 +19,21 @@
 // Scale factors above the point where every result rounds to 0 fill the
 // destination with 0 before any pixel is read.
 //
+// An op struct has: using Unit (the element a lane holds: the part type for
+// part-wise complex ops, the complex type for complex products); a
+// constructor from the scale factor; static constexpr bool kHasVector; bool
+// Vector() const (the call's scale factor may still refuse the vector path);
+// Unit Scalar(Unit, Unit) and VI Vec(VI, VI) (one argument each for unary
+// ops). IntOp, FloatOp and PartOp below build ops from an exact-operation
+// struct X; IntOp is exact for every scale factor.
+//
 // A family supplies a struct Fam with
 //   template <class T, Sf M> using Op;   two-image op, Scalar(src1, src2)
 //   template <class T, Sf M> using OpC;  constant op,  Scalar(src, value)
 //   template <class T> static constexpr Wide MaxAbs();  bound of |exact result|
 //   static constexpr int kIdentity;      constant (re part for complex) that
-//                                        makes the op a copy at sf 0
+//                                        makes the op a copy at sf 0 (constant
+//                                        forms of integer types only)
 // and names ArithBody / ArithIBody / ArithCBody / ArithCIBody (or, for unary
 // families whose Op has Scalar(a) and Vec(a), ArithUBody / ArithUIBody) in its
 // table. Families with their own checks or statuses call RunRows from their
