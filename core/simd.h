@@ -84,6 +84,27 @@ inline VI MulLoI16(VI a, VI b) { return _mm_mullo_epi16(a, b); }
 inline VI MulLoI32(VI a, VI b) { return _mm_mullo_epi32(a, b); }
 inline VI EqU8(VI a, VI b) { return _mm_cmpeq_epi8(a, b); }
 inline VI EqI32(VI a, VI b) { return _mm_cmpeq_epi32(a, b); }
+inline VI SubI8(VI a, VI b) { return _mm_sub_epi8(a, b); }
+inline VI AvgU8(VI a, VI b) { return _mm_avg_epu8(a, b); }     // (a + b + 1) >> 1
+inline VI AvgU16(VI a, VI b) { return _mm_avg_epu16(a, b); }   // (a + b + 1) >> 1
+inline VI MinU16(VI a, VI b) { return _mm_min_epu16(a, b); }
+inline VI MulAddPairsI16(VI a, VI b) { return _mm_madd_epi16(a, b); }  // a0*b0 + a1*b1 in 32 bits
+inline VI MulHiI16(VI a, VI b) { return _mm_mulhi_epi16(a, b); }
+inline VI MulHiU16(VI a, VI b) { return _mm_mulhi_epu16(a, b); }
+inline VI MinI16(VI a, VI b) { return _mm_min_epi16(a, b); }
+inline VI MaxI16(VI a, VI b) { return _mm_max_epi16(a, b); }
+inline VI MinI32(VI a, VI b) { return _mm_min_epi32(a, b); }
+inline VI MaxI32(VI a, VI b) { return _mm_max_epi32(a, b); }
+inline VI MinU32(VI a, VI b) { return _mm_min_epu32(a, b); }
+// Shifts by a count held in the low 64 bits of a register (counts above the
+// lane width give 0, or the sign for arithmetic right shifts).
+inline VI ShiftCount(int n) { return _mm_cvtsi32_si128(n); }
+inline VI SllI16(VI v, VI n) { return _mm_sll_epi16(v, n); }
+inline VI SrlI16(VI v, VI n) { return _mm_srl_epi16(v, n); }
+inline VI SraI16(VI v, VI n) { return _mm_sra_epi16(v, n); }
+inline VI SllI32(VI v, VI n) { return _mm_sll_epi32(v, n); }
+inline VI SrlI32(VI v, VI n) { return _mm_srl_epi32(v, n); }
+inline VI SraI32(VI v, VI n) { return _mm_sra_epi32(v, n); }
 
 // ---- widening and narrowing ----
 inline VI WidenLoU8(VI v) { return _mm_cvtepu8_epi16(v); }
@@ -96,6 +117,8 @@ inline VI PackUsS16(VI a, VI b) { return _mm_packus_epi16(a, b); }  // s16 -> u8
 inline VI PackSsS16(VI a, VI b) { return _mm_packs_epi16(a, b); }   // s16 -> s8, saturating
 inline VI PackUsS32(VI a, VI b) { return _mm_packus_epi32(a, b); }  // s32 -> u16, saturating
 inline VI PackSsS32(VI a, VI b) { return _mm_packs_epi32(a, b); }   // s32 -> s16, saturating
+inline VI InterleaveLo16(VI a, VI b) { return _mm_unpacklo_epi16(a, b); }
+inline VI InterleaveHi16(VI a, VI b) { return _mm_unpackhi_epi16(a, b); }
 
 // ---- float ----
 inline VF AddF(VF a, VF b) { return _mm_add_ps(a, b); }
@@ -112,5 +135,10 @@ inline VI CvtTruncF32(VF a) { return _mm_cvttps_epi32(a); }
 inline VF CvtI32F(VI a) { return _mm_cvtepi32_ps(a); }
 inline VI AsInt(VF a) { return _mm_castps_si128(a); }
 inline VF AsFloat(VI a) { return _mm_castsi128_ps(a); }
+// Complex pairs (re, im) in lanes 0-1 and 2-3.
+inline VF DupEvenF(VF a) { return _mm_moveldup_ps(a); }  // re, re
+inline VF DupOddF(VF a) { return _mm_movehdup_ps(a); }   // im, im
+inline VF SwapPairsF(VF a) { return _mm_shuffle_ps(a, a, _MM_SHUFFLE(2, 3, 0, 1)); }
+inline VF SubAddF(VF a, VF b) { return _mm_addsub_ps(a, b); }  // a - b in even lanes, a + b in odd
 
 }  // namespace pvx::simd

@@ -1,0 +1,681 @@
+// The element-wise frame of the arithmetic families (Add, Sub, Mul and their
+// constant forms; the division and unary families build on it too).
+//
+// An operation is a struct with a scalar member (the definition, used for row
+// tails and for the members that have no vector path) and a vector member that
+// maps whole 16-byte registers of units (elements, or complex numbers for the
+// complex multiplications) to a register of results. One row loop serves:
+//   - two images (in place is just src2 == dst),
+//   - an image and a constant (in place: src == dst); the constant is a
+//     pattern of one to three registers that repeats with the pixel, so C3
+//     constants line up,
+//   - one image (unary operations).
+// AC4 rows are computed as four channels and the destination's old alpha is
+// blended back in before the store, so alpha is never given a new value.
+//
+// Integer operations follow the scale-factor rule of core/sfs.h exactly: the
+// exact result is formed in 16- or 32-bit lanes, scaled (round half to even
+// for sf > 0, saturating shift up for sf < 0) and packed with saturation.
+// Scale factors above the point where every result rounds to 0 fill the
+// destination with 0 before any pixel is read.
+//
+// An op struct has: using Unit (the element a lane holds: the part type for
+// part-wise complex ops, the complex type for complex products); a
+// constructor from the scale factor; static constexpr bool kHasVector; bool
+// Vector() const (the call's scale factor may still refuse the vector path);
+// Unit Scalar(Unit, Unit) and VI Vec(VI, VI) (one argument each for unary
+// ops). IntOp, FloatOp and PartOp below build ops from an exact-operation
+// struct X; IntOp is exact for every scale factor.
+//
+// A family supplies a struct Fam with
+//   template <class T, Sf M> using Op;   two-image op, Scalar(src1, src2)
+//   template <class T, Sf M> using OpC;  constant op,  Scalar(src, value)
+//   template <class T> static constexpr Wide MaxAbs();  bound of |exact result|
+//   static constexpr int kIdentity;      constant (re part for complex) that
+//                                        makes the op a copy at sf 0 (constant
+//                                        forms of integer types only)
+// and names ArithBody / ArithIBody / ArithCBody / ArithCIBody (or, for unary
+// families whose Op has Scalar(a) and Vec(a), ArithUBody / ArithUIBody) in its
+// table. Families with their own checks or statuses call RunRows from their
+// own bodies; an op that must report something per call (a zero divisor)
+// can carry a pointer to a flag: ArithRow copies the op, not what it points to.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <cstring>
+#include <limits>
+#include <numeric>
+#include <type_traits>
+
+#include "check.h"
+#include "layout.h"
+#include "sfs.h"
+#include "simd.h"
+
+namespace pvx {
+
+// Scale-factor case of an integer op, chosen once per call; kNone for floats.
+// kHalf is sf == 1 for ops that have a whole-register path for it (the
+// others never see it).
+enum class Sf { kNone, kZero, kDown, kUp, kHalf };
+
+// The second operand of the row loop.
+enum class Src2 { kImage, kConst, kNone };
+
+// ---- scale-factor constants --------------------------------------------------
+
+// Scale factors beyond these give the same results (every non-zero result has
+// saturated), so shifts are capped and no shift count overflows.
+inline constexpr int kUpCap = 64;
+
+// Register constants of the Sfs rule for a destination element type U.
+struct SfsK {
+    int sf = 0;
+    simd::VI cnt;             // shift count: sf down, or min(-sf, bits of U) up
+    simd::VI one16, half16;   // 16-bit lanes: 1, 2^(sf-1) - 1
+    simd::VI one32, half32;   // 32-bit lanes
+    simd::VI lo16, hi16;      // shift-up clamps (lo - 1, hi + 1), 16-bit lanes
+    simd::VI lo32, hi32;      // 32-bit lanes
+};
+
+template <class U>
+inline SfsK MakeSfsK(int sf, Sf m)
+{
+    using namespace simd;
+    SfsK k;
+    k.sf = sf;
+    k.one16 = _mm_set1_epi16(1);
+    k.one32 = _mm_set1_epi32(1);
+    k.half16 = k.half32 = Zero();
+    k.lo16 = k.hi16 = k.lo32 = k.hi32 = Zero();
+    k.cnt = Zero();
+    if (m == Sf::kDown) {
+        int s = sf > 40 ? 40 : sf;
+        std::int64_t half = (std::int64_t{1} << (s - 1)) - 1;
+        k.cnt = ShiftCount(s);
+        k.half16 = _mm_set1_epi16(static_cast<short>(half & 0xFFFF));
+        k.half32 = _mm_set1_epi32(static_cast<int>(half & 0xFFFFFFFF));
+    } else if (m == Sf::kUp) {
+        // The result is r * 2^up saturated: clamp r to [lo - 1, hi + 1], where
+        // [lo, hi] are the values whose shifted result fits, then shift; the
+        // pack saturates the clamped ends. Beyond the width of U every non-zero
+        // result saturates, so the count is capped there.
+        using L = std::numeric_limits<U>;
+        constexpr int kBits = 8 * sizeof(U);
+        int up = sf < -kBits ? kBits : -sf;
+        std::int64_t hi = (static_cast<std::int64_t>(L::max()) >> up) + 1;
+        std::int64_t lo = L::is_signed ? -((-static_cast<std::int64_t>(L::min())) >> up) - 1 : -1;
+        k.cnt = ShiftCount(up);
+        k.hi16 = _mm_set1_epi16(static_cast<short>(hi > 32767 ? 32767 : hi));
+        k.lo16 = _mm_set1_epi16(static_cast<short>(lo < -32768 ? -32768 : lo));
+        k.hi32 = _mm_set1_epi32(static_cast<int>(hi));
+        k.lo32 = _mm_set1_epi32(static_cast<int>(lo));
+    }
+    return k;
+}
+
+// The scalar rule with the scale factor bounded so that no negation or shift
+// in it overflows; results are those of ScaleSat for every int.
+template <class U>
+inline U SfsScalar(Wide r, int sf)
+{
+    return ScaleSat<U>(r, sf < -kUpCap ? -kUpCap : sf);
+}
+
+// Scales exact results held in signed 16-bit lanes (8u results).
+template <Sf M>
+inline simd::VI Scale16(simd::VI r, const SfsK& k)
+{
+    using namespace simd;
+    if constexpr (M == Sf::kDown) {
+        VI odd = And(SraI16(r, k.cnt), k.one16);
+        return SraI16(AddI16(AddI16(r, odd), k.half16), k.cnt);
+    } else if constexpr (M == Sf::kUp) {
+        return SllI16(MaxI16(MinI16(r, k.hi16), k.lo16), k.cnt);
+    } else {
+        return r;
+    }
+}
+
+// Scales exact results held in unsigned 16-bit lanes (8u products, up to sf 8).
+template <Sf M>
+inline simd::VI Scale16U(simd::VI r, const SfsK& k)
+{
+    using namespace simd;
+    if constexpr (M == Sf::kDown) {
+        VI odd = And(SrlI16(r, k.cnt), k.one16);
+        return SrlI16(AddI16(AddI16(r, odd), k.half16), k.cnt);
+    } else if constexpr (M == Sf::kUp) {
+        return SllI16(MinU16(r, k.hi16), k.cnt);
+    } else {
+        return MinU16(r, _mm_set1_epi16(255));
+    }
+}
+
+// Scales exact results held in signed 32-bit lanes, or unsigned ones (kU32:
+// 16u products, which need all 32 bits).
+template <Sf M, bool kU32 = false>
+inline simd::VI Scale32(simd::VI r, const SfsK& k)
+{
+    using namespace simd;
+    if constexpr (kU32) {
+        if constexpr (M == Sf::kDown) {
+            VI odd = And(SrlI32(r, k.cnt), k.one32);
+            return SrlI32(AddI32(AddI32(r, odd), k.half32), k.cnt);
+        } else if constexpr (M == Sf::kUp) {
+            return SllI32(MinU32(r, k.hi32), k.cnt);
+        } else {
+            return MinU32(r, _mm_set1_epi32(0xFFFF));
+        }
+    } else {
+        if constexpr (M == Sf::kDown) {
+            VI odd = And(SraI32(r, k.cnt), k.one32);
+            return SraI32(AddI32(AddI32(r, odd), k.half32), k.cnt);
+        } else if constexpr (M == Sf::kUp) {
+            return SllI32(MaxI32(MinI32(r, k.hi32), k.lo32), k.cnt);
+        } else {
+            return r;
+        }
+    }
+}
+
+// Packs scaled 32-bit lanes to U with saturation: two registers for 16-bit U,
+// four for 8u.
+template <class U>
+inline simd::VI Narrow32(const simd::VI* r)
+{
+    using namespace simd;
+    if constexpr (std::is_same_v<U, Pvx8u>) return PackUsS16(PackSsS32(r[0], r[1]), PackSsS32(r[2], r[3]));
+    else if constexpr (std::is_same_v<U, Pvx16u>) return PackUsS32(r[0], r[1]);
+    else return PackSsS32(r[0], r[1]);
+}
+
+// Widens a register of U to 32-bit lanes (zero or sign extension).
+template <class U>
+inline void Widen32(simd::VI v, simd::VI* out)
+{
+    using namespace simd;
+    if constexpr (std::is_same_v<U, Pvx8u>) {
+        VI lo = WidenLoU8(v), hi = WidenHiU8(v);
+        out[0] = WidenLoU16(lo);
+        out[1] = WidenHiU16(lo);
+        out[2] = WidenLoU16(hi);
+        out[3] = WidenHiU16(hi);
+    } else if constexpr (std::is_same_v<U, Pvx16u>) {
+        out[0] = WidenLoU16(v);
+        out[1] = WidenHiU16(v);
+    } else {
+        out[0] = WidenLoS16(v);
+        out[1] = WidenHiS16(v);
+    }
+}
+
+// ---- exact operations and the op structs ----------------------------------------
+
+// Defaults for the exact-operation structs of the families (X below):
+//   static Wide Exact(Wide a, Wide b)     the exact integer result
+//   static float F(float a, float b), static VF V(VF a, VF b)   float forms
+//   kFits16: 8u results and their rounding fit signed 16-bit lanes
+//     (then static VI L16(VI a, VI b) on widened lanes)
+//   kFits16U: 8u results fit unsigned 16-bit lanes, with their rounding up
+//     to sf 8 (then static VI L16(VI a, VI b) on widened lanes; 32-bit lanes
+//     above sf 8)
+//   template <class U> static VI Half(VI a, VI b): the whole sf == 1 result
+//   template <class U> static VI Down(VI a, VI b, const SfsK&): the whole
+//     result for sf 1 to 15 (32-bit lanes above)
+//   static VI L32(VI a, VI b) on 32-bit lanes, or
+//   template <class U> static void Exact32(VI a, VI b, VI* r) on raw registers
+//   template <class U> static VI Sat(VI a, VI b): the whole sf == 0 result
+//   kU32<U>: the exact result needs unsigned 32-bit lanes (vector up to sf 16)
+// Ops state kHasVector; Vector() may still refuse a call's scale factor.
+struct ExactBase {
+    static constexpr bool kFits16 = false;
+    static constexpr bool kFits16U = false;
+    template <class U> static constexpr bool kU32 = false;
+};
+
+template <class X, class U>
+concept HasSat = requires(simd::VI a) { X::template Sat<U>(a, a); };
+template <class X, class U>
+concept HasHalf = requires(simd::VI a) { X::template Half<U>(a, a); };
+template <class X, class U>
+concept HasDown = requires(simd::VI a, const SfsK& k) { X::template Down<U>(a, a, k); };
+template <class X, class U>
+concept HasExact32 = requires(simd::VI a, simd::VI* r) { X::template Exact32<U>(a, a, r); };
+
+// Integer op on elements U (8u, 16u, 16s, 32s) under the Sfs rule. 32s and the
+// unsigned 32-bit products above sf 16 take the scalar path.
+template <class X, class U, Sf M>
+struct IntOp {
+    using Unit = U;
+    static constexpr bool kHasVector = sizeof(U) <= 2;
+    static constexpr bool kHalfPath = HasHalf<X, U>;
+    SfsK k;
+    bool vec;
+    explicit IntOp(int sf)
+        : k(MakeSfsK<U>(sf, M)), vec(sizeof(U) <= 2 && !(X::template kU32<U> && M == Sf::kDown && sf > 16))
+    {
+    }
+    bool Vector() const { return vec; }
+    U Scalar(U a, U b) const { return SfsScalar<U>(X::Exact(a, b), k.sf); }
+    simd::VI Vec(simd::VI a, simd::VI b) const
+    {
+        using namespace simd;
+        if constexpr (M == Sf::kZero && HasSat<X, U>) {
+            return X::template Sat<U>(a, b);
+        } else if constexpr (M == Sf::kHalf) {
+            return X::template Half<U>(a, b);
+        } else if constexpr (M == Sf::kDown && HasDown<X, U>) {
+            return k.sf <= 15 ? X::template Down<U>(a, b, k) : Vec32(a, b);
+        } else if constexpr (sizeof(U) == 1 && X::kFits16U) {
+            if (M != Sf::kDown || k.sf <= 8) {
+                VI lo = Scale16U<M>(X::L16(WidenLoU8(a), WidenLoU8(b)), k);
+                VI hi = Scale16U<M>(X::L16(WidenHiU8(a), WidenHiU8(b)), k);
+                return PackUsS16(lo, hi);
+            }
+            return Vec32(a, b);
+        } else if constexpr (sizeof(U) == 1 && X::kFits16) {
+            VI lo = Scale16<M>(X::L16(WidenLoU8(a), WidenLoU8(b)), k);
+            VI hi = Scale16<M>(X::L16(WidenHiU8(a), WidenHiU8(b)), k);
+            return PackUsS16(lo, hi);
+        } else {
+            return Vec32(a, b);
+        }
+    }
+    // Exact results in 32-bit lanes, scaled and packed.
+    simd::VI Vec32(simd::VI a, simd::VI b) const
+    {
+        using namespace simd;
+        if constexpr (sizeof(U) <= 2) {
+            constexpr int kN = 4 / sizeof(U);
+            VI r[kN];
+            if constexpr (HasExact32<X, U>) {
+                X::template Exact32<U>(a, b, r);
+            } else {
+                VI wa[kN], wb[kN];
+                Widen32<U>(a, wa);
+                Widen32<U>(b, wb);
+                for (int i = 0; i < kN; ++i) r[i] = X::L32(wa[i], wb[i]);
+            }
+            for (int i = 0; i < kN; ++i) r[i] = Scale32<M, X::template kU32<U>>(r[i], k);
+            return Narrow32<U>(r);
+        } else {
+            static_assert(sizeof(U) <= 2, "no vector path for 32-bit elements");
+            return a;
+        }
+    }
+};
+
+// Float op (IEEE single, results as computed).
+template <class X>
+struct FloatOp {
+    using Unit = Pvx32f;
+    static constexpr bool kHasVector = true;
+    explicit FloatOp(int) {}
+    bool Vector() const { return true; }
+    Pvx32f Scalar(Pvx32f a, Pvx32f b) const { return X::F(a, b); }
+    simd::VI Vec(simd::VI a, simd::VI b) const { return simd::AsInt(X::V(simd::AsFloat(a), simd::AsFloat(b))); }
+};
+
+// The op of X for pixel type T: complex types work part by part.
+template <class X, class T, Sf M>
+using PartOp = std::conditional_t<std::is_floating_point_v<Element<T>>, FloatOp<X>, IntOp<X, Element<T>, M>>;
+
+// Unary ops of the frame itself.
+template <class U>
+struct ZeroOp {
+    using Unit = U;
+    static constexpr bool kHasVector = true;
+    bool Vector() const { return true; }
+    U Scalar(U) const { return U{}; }
+    simd::VI Vec(simd::VI) const { return simd::Zero(); }
+};
+template <class U>
+struct IdentityOp {
+    using Unit = U;
+    static constexpr bool kHasVector = true;
+    bool Vector() const { return true; }
+    U Scalar(U a) const { return a; }
+    simd::VI Vec(simd::VI a) const { return a; }
+};
+
+// ---- the row loop ---------------------------------------------------------------
+
+// The repeating per-register data of layout L for units U: the constant
+// pattern (C3 needs three registers to line up again) and the AC4 alpha mask.
+template <class U, class T, Lay L>
+struct Pattern {
+    static constexpr int kPerChannel = sizeof(T) / sizeof(U);        // 2 for part-wise complex
+    static constexpr int kPixelUnits = kChannels<L> * kPerChannel;   // units per pixel
+    static constexpr int kKeptUnits = kProcessed<L> * kPerChannel;   // units written per pixel
+    static constexpr int kPixelBytes = kPixelUnits * static_cast<int>(sizeof(U));
+    static constexpr int kRegs = std::lcm(kPixelBytes, simd::kBytes) / simd::kBytes;
+    static constexpr int kLanes = simd::kBytes / static_cast<int>(sizeof(U));  // units per register
+    static constexpr int kUnits = kRegs * kLanes;
+    static_assert(simd::kBytes % sizeof(U) == 0 && kRegs <= 3);
+
+    alignas(16) U unit[kUnits];
+    simd::VI cst[kRegs];
+    simd::VI alpha[kRegs];
+
+    // value: kProcessed<L> pixel elements, or null (no constant).
+    explicit Pattern(const T* value)
+    {
+        const U* v = reinterpret_cast<const U*>(value);
+        for (int i = 0; i < kUnits; ++i) {
+            int c = i % kPixelUnits;
+            unit[i] = v && c < kKeptUnits ? v[c] : U{};
+        }
+        alignas(16) std::uint8_t mask[kRegs * simd::kBytes];
+        for (int j = 0; j < kRegs * simd::kBytes; ++j)
+            mask[j] = j % kPixelBytes >= kKeptUnits * static_cast<int>(sizeof(U)) ? 0xFF : 0;
+        for (int r = 0; r < kRegs; ++r) {
+            cst[r] = simd::LoadA(reinterpret_cast<const std::uint8_t*>(unit) + r * simd::kBytes);
+            alpha[r] = simd::LoadA(mask + r * simd::kBytes);
+        }
+    }
+};
+
+// One row of n units: d = op(a, b), op(a, value pattern) or op(a). Vector body
+// in groups of the pattern's registers, scalar tail (never re-running a vector
+// over done units, so in-place rows stay right). AC4: the alpha units of d keep
+// their value. A selects aligned loads and stores.
+template <class Op, class T, Lay L, Src2 K, bool A>
+void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const typename Op::Unit* a,
+              const typename Op::Unit* b, typename Op::Unit* d, std::ptrdiff_t n)
+{
+    using namespace simd;
+    using P = Pattern<typename Op::Unit, T, L>;
+    constexpr bool kAlpha = kKeepsAlpha<L>;
+    std::ptrdiff_t i = 0;
+    if constexpr (Op::kHasVector) {
+        // Local copies: the stores below may alias anything reached through a
+        // reference, so constants held there would be reloaded every register.
+        const Op o = op;
+        VI cst[P::kRegs], alpha[P::kRegs];
+        for (int r = 0; r < P::kRegs; ++r) {
+            cst[r] = pat.cst[r];
+            alpha[r] = pat.alpha[r];
+        }
+        std::ptrdiff_t nv = o.Vector() ? n : 0;
+        for (; i + P::kUnits <= nv; i += P::kUnits) {
+            for (int r = 0; r < P::kRegs; ++r) {
+                std::ptrdiff_t j = i + r * P::kLanes;
+                VI va = Load<A>(a + j);
+                VI v;
+                if constexpr (K == Src2::kImage) v = o.Vec(va, Load<A>(b + j));
+                else if constexpr (K == Src2::kConst) v = o.Vec(va, cst[r]);
+                else v = o.Vec(va);
+                if constexpr (kAlpha) v = SelectBytes(v, Load<A>(d + j), alpha[r]);
+                Store<A>(d + j, v);
+            }
+        }
+    }
+    for (; i < n; ++i) {
+        if constexpr (kAlpha)
+            if (i % P::kPixelUnits >= P::kKeptUnits) continue;
+        if constexpr (K == Src2::kImage) d[i] = op.Scalar(a[i], b[i]);
+        else if constexpr (K == Src2::kConst) d[i] = op.Scalar(a[i], pat.unit[i % P::kUnits]);
+        else d[i] = op.Scalar(a[i]);
+    }
+}
+
+// Every row of the region: rows merged into one when every step equals the
+// row length; aligned or unaligned path chosen per row by its addresses. For
+// kConst, value holds the constant's kProcessed<L> elements; for kNone, b is
+// unused (pass a).
+template <class T, Lay L, Src2 K, class Op>
+void RunRows(const Op& op, const T* a, int aStep, const T* b, int bStep, T* d, int dStep, PvxiSize roi,
+             const T* value = nullptr)
+{
+    using U = typename Op::Unit;
+    using P = Pattern<U, T, L>;
+    const P pat(value);
+    std::ptrdiff_t rowBytes = static_cast<std::ptrdiff_t>(roi.width) * kChannels<L> * sizeof(T);
+    std::ptrdiff_t n = rowBytes / static_cast<std::ptrdiff_t>(sizeof(U));
+    int rows = roi.height;
+    bool merged = K == Src2::kImage ? RowsContiguous(rowBytes, {aStep, bStep, dStep})
+                                    : RowsContiguous(rowBytes, {aStep, dStep});
+    if (merged) {
+        n *= rows;
+        rows = 1;
+    }
+    for (int y = 0; y < rows; ++y) {
+        const U* ra = reinterpret_cast<const U*>(RowAt(a, aStep, y));
+        const U* rb = K == Src2::kImage ? reinterpret_cast<const U*>(RowAt(b, bStep, y)) : ra;
+        U* rd = reinterpret_cast<U*>(RowAt(d, dStep, y));
+        if (simd::IsAligned(ra) && simd::IsAligned(rb) && simd::IsAligned(rd))
+            ArithRow<Op, T, L, K, true>(op, pat, ra, rb, rd, n);
+        else
+            ArithRow<Op, T, L, K, false>(op, pat, ra, rb, rd, n);
+    }
+}
+
+// ---- shortcuts --------------------------------------------------------------------
+
+// Fills the processed channels of the region with 0 (AC4 alpha kept): the
+// result of every scale factor at which all results round to 0.
+template <class T, Lay L>
+PvxStatus FillZero(T* pDst, int dstStep, PvxiSize roi)
+{
+    using U = Element<T>;
+    RunRows<T, L, Src2::kNone>(ZeroOp<U>{}, pDst, dstStep, pDst, dstStep, pDst, dstStep, roi);
+    return pvxStsNoErr;
+}
+
+// Copies the processed channels of the region (AC4 alpha kept): the result of
+// an identity constant at scale factor 0.
+template <class T, Lay L>
+PvxStatus CopyRows(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
+{
+    if constexpr (kKeepsAlpha<L>) {
+        RunRows<T, L, Src2::kNone>(IdentityOp<Element<T>>{}, pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi);
+    } else {
+        std::size_t rowBytes = static_cast<std::size_t>(roi.width) * kChannels<L> * sizeof(T);
+        int rows = roi.height;
+        if (RowsContiguous(static_cast<std::ptrdiff_t>(rowBytes), {srcStep, dstStep})) {
+            rowBytes *= rows;
+            rows = 1;
+        }
+        for (int y = 0; y < rows; ++y)
+            if (RowAt(pSrc, srcStep, y) != RowAt(pDst, dstStep, y))
+                std::memmove(RowAt(pDst, dstStep, y), RowAt(pSrc, srcStep, y), rowBytes);
+    }
+    return pvxStsNoErr;
+}
+
+// The smallest positive scale factor at which every exact result with
+// |r| <= maxAbs rounds to 0 (ties go to the even 0).
+constexpr int ZeroFrom(Wide maxAbs)
+{
+    int s = 1;
+    while ((static_cast<Wide>(1) << (s - 1)) < maxAbs) ++s;
+    return s;
+}
+
+// True when the constant makes the family's op a copy at scale factor 0.
+template <class Fam, class T, Lay L>
+bool IsIdentity(const T* value)
+{
+    using E = Element<T>;
+    const E* v = reinterpret_cast<const E*>(value);
+    for (int c = 0; c < kProcessed<L>; ++c) {
+        if constexpr (kIsComplex<T>) {
+            if (v[2 * c] != Fam::kIdentity || v[2 * c + 1] != 0) return false;
+        } else {
+            if (v[c] != Fam::kIdentity) return false;
+        }
+    }
+    return true;
+}
+
+// The family's op for the second operand K: OpC for constants, else Op.
+template <class Fam, class T, Src2 K, Sf M>
+struct OpOfT {
+    using type = typename Fam::template Op<T, M>;
+};
+template <class Fam, class T, Sf M>
+struct OpOfT<Fam, T, Src2::kConst, M> {
+    using type = typename Fam::template OpC<T, M>;
+};
+template <class Fam, class T, Src2 K, Sf M>
+using OpOf = typename OpOfT<Fam, T, K, M>::type;
+template <class Op>
+concept HalfPathOp = requires { requires Op::kHalfPath; };
+
+// Runs the family's op over the region for the scale factor: zero fill above
+// the family's zero point, else the op for sf 0, down or up.
+template <class Fam, class T, Lay L, Src2 K>
+PvxStatus ArithRun(const T* a, int aStep, const T* b, int bStep, T* d, int dStep, PvxiSize roi, int sf,
+                   const T* value)
+{
+    auto run = [&]<Sf M>() {
+        using Op = OpOf<Fam, T, K, M>;
+        RunRows<T, L, K>(Op(sf), a, aStep, b, bStep, d, dStep, roi, value);
+    };
+    if constexpr (std::is_floating_point_v<Element<T>>) {
+        run.template operator()<Sf::kNone>();
+    } else {
+        constexpr int kZeroFrom = ZeroFrom(Fam::template MaxAbs<T>());
+        if (sf >= kZeroFrom) return FillZero<T, L>(d, dStep, roi);
+        if (sf == 0) {
+            if constexpr (K == Src2::kConst)
+                if (IsIdentity<Fam, T, L>(value)) return CopyRows<T, L>(a, aStep, d, dStep, roi);
+            run.template operator()<Sf::kZero>();
+        } else if (sf > 0) {
+            if constexpr (HalfPathOp<OpOf<Fam, T, K, Sf::kDown>>) {
+                if (sf == 1) {
+                    run.template operator()<Sf::kHalf>();
+                    return pvxStsNoErr;
+                }
+            }
+            run.template operator()<Sf::kDown>();
+        } else {
+            run.template operator()<Sf::kUp>();
+        }
+    }
+    return pvxStsNoErr;
+}
+
+// ---- checked bodies ------------------------------------------------------------------
+// O is the family's check order: real types kPtrSize (steps used as given),
+// complex types kPtrSizeStep. Float forms have no scale factor.
+
+// Two images: d = op(src1, src2).
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithBody(const T* pSrc1, int src1Step, const T* pSrc2, int src2Step, T* pDst, int dstStep, PvxiSize roi,
+                    int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({pSrc1, pSrc2, pDst}, roi, {src1Step, src2Step, dstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kImage>(pSrc1, src1Step, pSrc2, src2Step, pDst, dstStep, roi, scaleFactor,
+                                            nullptr);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithBody(const T* pSrc1, int src1Step, const T* pSrc2, int src2Step, T* pDst, int dstStep, PvxiSize roi)
+{
+    return ArithBody<Fam, T, L, O>(pSrc1, src1Step, pSrc2, src2Step, pDst, dstStep, roi, 0);
+}
+
+// In place: srcDst = op(src, srcDst); the in-place image is the second operand.
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithIBody(const T* pSrc, int srcStep, T* pSrcDst, int srcDstStep, PvxiSize roi, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({pSrc, pSrcDst}, roi, {srcStep, srcDstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kImage>(pSrc, srcStep, pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi,
+                                            scaleFactor, nullptr);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithIBody(const T* pSrc, int srcStep, T* pSrcDst, int srcDstStep, PvxiSize roi)
+{
+    return ArithIBody<Fam, T, L, O>(pSrc, srcStep, pSrcDst, srcDstStep, roi, 0);
+}
+
+// Constant: d = op(src, value); one value (C1) or a pointer to 3 or 4, which is
+// checked with the other pointers in argument order.
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithCBody(const T* pSrc, int srcStep, const T* value, T* pDst, int dstStep, PvxiSize roi, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({pSrc, value, pDst}, roi, {srcStep, dstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kConst>(pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi, scaleFactor, value);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithCBody(const T* pSrc, int srcStep, T value, T* pDst, int dstStep, PvxiSize roi, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({pSrc, pDst}, roi, {srcStep, dstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kConst>(pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi, scaleFactor, &value);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithCBody(const T* pSrc, int srcStep, const T* value, T* pDst, int dstStep, PvxiSize roi)
+{
+    return ArithCBody<Fam, T, L, O>(pSrc, srcStep, value, pDst, dstStep, roi, 0);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithCBody(const T* pSrc, int srcStep, T value, T* pDst, int dstStep, PvxiSize roi)
+{
+    return ArithCBody<Fam, T, L, O>(pSrc, srcStep, value, pDst, dstStep, roi, 0);
+}
+
+// Constant in place: srcDst = op(srcDst, value).
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithCIBody(const T* value, T* pSrcDst, int srcDstStep, PvxiSize roi, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({value, pSrcDst}, roi, {srcDstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kConst>(pSrcDst, srcDstStep, pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi,
+                                            scaleFactor, value);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithCIBody(T value, T* pSrcDst, int srcDstStep, PvxiSize roi, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({pSrcDst}, roi, {srcDstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kConst>(pSrcDst, srcDstStep, pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi,
+                                            scaleFactor, &value);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithCIBody(const T* value, T* pSrcDst, int srcDstStep, PvxiSize roi)
+{
+    return ArithCIBody<Fam, T, L, O>(value, pSrcDst, srcDstStep, roi, 0);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithCIBody(T value, T* pSrcDst, int srcDstStep, PvxiSize roi)
+{
+    return ArithCIBody<Fam, T, L, O>(value, pSrcDst, srcDstStep, roi, 0);
+}
+
+// One image (unary families: Fam::Op has Scalar(a) and Vec(a)): d = op(src).
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({pSrc, pDst}, roi, {srcStep, dstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kNone>(pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi, scaleFactor, nullptr);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
+{
+    return ArithUBody<Fam, T, L, O>(pSrc, srcStep, pDst, dstStep, roi, 0);
+}
+
+// One image in place: srcDst = op(srcDst).
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUIBody(T* pSrcDst, int srcDstStep, PvxiSize roi, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({pSrcDst}, roi, {srcDstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kNone>(pSrcDst, srcDstStep, pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi,
+                                           scaleFactor, nullptr);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUIBody(T* pSrcDst, int srcDstStep, PvxiSize roi)
+{
+    return ArithUIBody<Fam, T, L, O>(pSrcDst, srcDstStep, roi, 0);
+}
+
+// The bound of |exact result| of the common operations on elements E.
+template <class E>
+constexpr Wide ElemMaxAbs()
+{
+    using Lim = std::numeric_limits<E>;
+    Wide lo = Lim::min(), hi = Lim::max();
+    return -lo > hi ? -lo : hi;
+}
+
+}  // namespace pvx
