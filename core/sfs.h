@@ -39,7 +39,7 @@ constexpr Wide ScaleRound(Wide r, int sf)
     }
     // Any non-zero r shifted up by 40 saturates every destination of 32 bits
     // or less, so the shift is capped there.
-    int up = -sf > 40 ? 40 : -sf;
+    int up = sf < -40 ? 40 : -sf;  // compared before negating: sf may be INT_MIN
     return r * (static_cast<Wide>(1) << up);
 }
 

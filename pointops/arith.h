@@ -49,6 +49,7 @@
 #include <type_traits>
 
 #include "check.h"
+#include "forward.h"
 #include "layout.h"
 #include "sfs.h"
 #include "simd.h"
@@ -459,6 +460,7 @@ void RunRows(const Op& op, const T* a, int aStep, const T* b, int bStep, T* d, i
 template <class T, Lay L>
 PvxStatus FillZero(T* pDst, int dstStep, PvxiSize roi)
 {
+    if constexpr (kHasMoveMembers<T, L>) return SetZeroForward<T, L>(pDst, dstStep, roi);
     using U = Element<T>;
     RunRows<T, L, Src2::kNone>(ZeroOp<U>{}, pDst, dstStep, pDst, dstStep, pDst, dstStep, roi);
     return pvxStsNoErr;
@@ -469,7 +471,10 @@ PvxStatus FillZero(T* pDst, int dstStep, PvxiSize roi)
 template <class T, Lay L>
 PvxStatus CopyRows(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
 {
-    if constexpr (kKeepsAlpha<L>) {
+    if (pSrc == pDst && srcStep == dstStep) return pvxStsNoErr;  // in place: nothing moves
+    if constexpr (kHasMoveMembers<T, L>) {
+        return CopyForward<T, L>(pSrc, srcStep, pDst, dstStep, roi);
+    } else if constexpr (kKeepsAlpha<L>) {
         RunRows<T, L, Src2::kNone>(IdentityOp<Element<T>>{}, pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi);
     } else {
         std::size_t rowBytes = static_cast<std::size_t>(roi.width) * kChannels<L> * sizeof(T);
