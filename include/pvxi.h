@@ -62,6 +62,43 @@ PVX_API const PvxVersionRecord* pvxiGetLibVersion(void);
 /* The caller's floating-point control is restored before return. */
 PVX_API PvxStatus pvxiConvert_32f8u_C1R(const Pvx32f* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int roundMode);
 
+/* ==== pointops/swapchannels.api ==== */
+
+/* ---- SwapChannels ---- */
+/* Destination channel i receives source channel dstOrder[i]; entries are checked as unsigned numbers (-60). */
+/* C3R, C3IR: 3 entries 0..2. C4R, C4IR: 4 entries 0..3. AC4R: 3 entries 0..2, destination alpha never written. */
+/* C3C4R: 4 entries 0..3; an entry of 3 leaves that destination channel as it was. C4C3R: 3 entries 0..3. */
+/* pSrc == pDst on C3R, C4R, AC4R works in place on the destination rows (dstStep), whatever srcStep is. */
+/* Checks: *R pointers (source, destination, order) -8, sizes -6, a step of 0 -14, entries -60; */
+/* *IR image pointer -8, a step of 0 -14, sizes -6, order pointer -8, entries -60. Negative steps are used as given. */
+PVX_API PvxStatus pvxiSwapChannels_8u_C3R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_8u_C4R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_8u_AC4R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_8u_C3C4R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_8u_C4C3R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_16u_C3R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_16u_C4R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_16u_AC4R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_16u_C3C4R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_16u_C4C3R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_16s_C3R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_16s_C4R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_16s_AC4R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_16s_C3C4R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_16s_C4C3R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_32s_C3R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_32s_C4R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_32s_AC4R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_32s_C3C4R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_32s_C4C3R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_32f_C3R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_32f_C4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_32f_AC4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_32f_C3C4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_32f_C4C3R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_8u_C3IR(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, const int* dstOrder);
+PVX_API PvxStatus pvxiSwapChannels_8u_C4IR(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, const int* dstOrder);
+
 #ifdef __cplusplus
 }
 #endif
