@@ -29,6 +29,7 @@ inline void StoreA(void* p, VI v) { _mm_store_si128(static_cast<VI*>(p), v); }
 inline void StoreNt(void* p, VI v) { _mm_stream_si128(static_cast<VI*>(p), v); }
 inline void StoreLo64(void* p, VI v) { _mm_storel_epi64(static_cast<VI*>(p), v); }
 inline void StoreFence() { _mm_sfence(); }
+inline void StoreHi64(void* p, VI v) { _mm_storeh_pd(static_cast<double*>(p), _mm_castsi128_pd(v)); }
 
 inline VF LoadUF(const float* p) { return _mm_loadu_ps(p); }
 inline VF LoadAF(const float* p) { return _mm_load_ps(p); }
@@ -56,6 +57,15 @@ inline VI AndNot(VI notThis, VI b) { return _mm_andnot_si128(notThis, b); }
 // Bytes of b where the mask byte's top bit is set, else bytes of a.
 inline VI SelectBytes(VI a, VI b, VI mask) { return _mm_blendv_epi8(a, b, mask); }
 inline VI ShuffleBytes(VI v, VI idx) { return _mm_shuffle_epi8(v, idx); }
+// Interleaving of the low or high halves of a and b, by element width.
+inline VI InterleaveLo8(VI a, VI b) { return _mm_unpacklo_epi8(a, b); }
+inline VI InterleaveHi8(VI a, VI b) { return _mm_unpackhi_epi8(a, b); }
+inline VI InterleaveLo16(VI a, VI b) { return _mm_unpacklo_epi16(a, b); }
+inline VI InterleaveHi16(VI a, VI b) { return _mm_unpackhi_epi16(a, b); }
+inline VI InterleaveLo32(VI a, VI b) { return _mm_unpacklo_epi32(a, b); }
+inline VI InterleaveHi32(VI a, VI b) { return _mm_unpackhi_epi32(a, b); }
+inline VI InterleaveLo64(VI a, VI b) { return _mm_unpacklo_epi64(a, b); }
+inline VI InterleaveHi64(VI a, VI b) { return _mm_unpackhi_epi64(a, b); }
 
 // ---- integer arithmetic ----
 inline VI AddSatU8(VI a, VI b) { return _mm_adds_epu8(a, b); }

@@ -99,6 +99,43 @@ PVX_API PvxStatus pvxiSwapChannels_32f_C4C3R(const Pvx32f* pSrc, int srcStep, Pv
 PVX_API PvxStatus pvxiSwapChannels_8u_C3IR(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, const int* dstOrder);
 PVX_API PvxStatus pvxiSwapChannels_8u_C4IR(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, const int* dstOrder);
 
+/* ==== pointops/transpose.api ==== */
+
+/* ---- Transpose ---- */
+/* Destination (x, y) is source (y, x); roiSize is the source size, the destination is height x width. */
+/* *R: pointers -8, sizes -6; steps are used as given (0 and negative included). */
+/* *IR: pointer -8; sizes below 1 or width != height -6. Transposed in tiles of at most 32 x 32. */
+PVX_API PvxStatus pvxiTranspose_8u_C1R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_8u_C3R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_8u_C4R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16u_C1R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16u_C3R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16u_C4R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16s_C1R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16s_C3R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16s_C4R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32s_C1R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32s_C3R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32s_C4R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32f_C1R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32f_C3R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32f_C4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_8u_C1IR(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_8u_C3IR(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_8u_C4IR(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16u_C1IR(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16u_C3IR(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16u_C4IR(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16s_C1IR(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16s_C3IR(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_16s_C4IR(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32s_C1IR(Pvx32s* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32s_C3IR(Pvx32s* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32s_C4IR(Pvx32s* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32f_C1IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32f_C3IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiTranspose_32f_C4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
 #ifdef __cplusplus
 }
 #endif
