@@ -62,6 +62,58 @@ PVX_API const PvxVersionRecord* pvxiGetLibVersion(void);
 /* The caller's floating-point control is restored before return. */
 PVX_API PvxStatus pvxiConvert_32f8u_C1R(const Pvx32f* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int roundMode);
 
+/* ==== pointops/mirror.api ==== */
+
+/* ---- Mirror ---- */
+/* flip 0: top and bottom exchanged; 1: left and right; 2: both. AC4: the alpha channel is never written. */
+/* flip 3 (one-channel *R only): main diagonal, dst(x, y) = src(y, x); flip 4: dst(x, y) = src(W-1-y, H-1-x); */
+/* the result of a diagonal flip is H x W. Every other member answers -21 to 3 and 4. */
+/* *R with pSrc == pDst and srcStep == dstStep is the in-place form, before any check. */
+/* Checks: pointers -8, sizes -6, flip outside 0..2 -21, a flip that changes nothing -6 */
+/* (flip 0 or 2 with height 1, flip 1 or 2 with width 1); steps are not checked. */
+/* Diagonals: pointers -8; steps below 1 or not a multiple of the element size -14; sizes -6; */
+/* -9999 unless srcStep holds W and dstStep H elements and the source and destination spans are disjoint. */
+PVX_API PvxStatus pvxiMirror_8u_C1R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_8u_C3R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_8u_C4R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_8u_AC4R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16u_C1R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16u_C3R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16u_C4R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16u_AC4R(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16s_C1R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16s_C3R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16s_C4R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16s_AC4R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32s_C1R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32s_C3R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32s_C4R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32s_AC4R(const Pvx32s* pSrc, int srcStep, Pvx32s* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32f_C1R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32f_C3R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32f_C4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32f_AC4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_8u_C1IR(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_8u_C3IR(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_8u_C4IR(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_8u_AC4IR(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16u_C1IR(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16u_C3IR(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16u_C4IR(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16u_AC4IR(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16s_C1IR(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16s_C3IR(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16s_C4IR(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_16s_AC4IR(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32s_C1IR(Pvx32s* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32s_C3IR(Pvx32s* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32s_C4IR(Pvx32s* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32s_AC4IR(Pvx32s* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32f_C1IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32f_C3IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32f_C4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+PVX_API PvxStatus pvxiMirror_32f_AC4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize, int flip);
+
 /* ==== pointops/swapchannels.api ==== */
 
 /* ---- SwapChannels ---- */
