@@ -29,7 +29,7 @@ inline void StoreA(void* p, VI v) { _mm_store_si128(static_cast<VI*>(p), v); }
 inline void StoreNt(void* p, VI v) { _mm_stream_si128(static_cast<VI*>(p), v); }
 inline void StoreLo64(void* p, VI v) { _mm_storel_epi64(static_cast<VI*>(p), v); }
 inline void StoreFence() { _mm_sfence(); }
-inline void StoreHi64(void* p, VI v) { _mm_storeh_pd(static_cast<double*>(p), _mm_castsi128_pd(v)); }
+inline void StoreHi64(void* p, VI v) { _mm_storel_epi64(static_cast<VI*>(p), _mm_unpackhi_epi64(v, v)); }
 
 inline VF LoadUF(const float* p) { return _mm_loadu_ps(p); }
 inline VF LoadAF(const float* p) { return _mm_load_ps(p); }
