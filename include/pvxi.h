@@ -70,7 +70,7 @@ PVX_API PvxStatus pvxiConvert_32f8u_C1R(const Pvx32f* pSrc, int srcStep, Pvx8u* 
 /* the result of a diagonal flip is H x W. Every other member answers -21 to 3 and 4. */
 /* *R with pSrc == pDst and srcStep == dstStep is the in-place form, before any check. */
 /* Checks: pointers -8, sizes -6, flip outside 0..2 -21, a flip that changes nothing -6 */
-/* (flip 0 or 2 with height 1, flip 1 or 2 with width 1); steps are not checked. */
+/* (flip 0 or 2 with height 1, flip 1 or 2 with width 1); steps are not checked. *IR check the same way. */
 /* Diagonals: pointers -8; steps below 1 or not a multiple of the element size -14; sizes -6; */
 /* -9999 unless srcStep holds W and dstStep H elements and the source and destination spans are disjoint. */
 PVX_API PvxStatus pvxiMirror_8u_C1R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int flip);
@@ -120,7 +120,8 @@ PVX_API PvxStatus pvxiMirror_32f_AC4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize
 /* Destination channel i receives source channel dstOrder[i]; entries are checked as unsigned numbers (-60). */
 /* C3R, C3IR: 3 entries 0..2. C4R, C4IR: 4 entries 0..3. AC4R: 3 entries 0..2, destination alpha never written. */
 /* C3C4R: 4 entries 0..3; an entry of 3 leaves that destination channel as it was. C4C3R: 3 entries 0..3. */
-/* pSrc == pDst on C3R, C4R, AC4R works in place on the destination rows (dstStep), whatever srcStep is. */
+/* pSrc == pDst on C3R, C4R, AC4R works in place on the destination rows (dstStep), whatever srcStep is; */
+/* C3C4R and C4C3R change the pixel size and need regions that do not overlap. */
 /* Checks: *R pointers (source, destination, order) -8, sizes -6, a step of 0 -14, entries -60; */
 /* *IR image pointer -8, a step of 0 -14, sizes -6, order pointer -8, entries -60. Negative steps are used as given. */
 PVX_API PvxStatus pvxiSwapChannels_8u_C3R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);
