@@ -50,11 +50,26 @@ namespace {
 using namespace simd;
 using Bytes = std::uint8_t;
 
-inline PvxStatus TransposeC1(const Pvx8u* s, int ss, Pvx8u* d, int ds, PvxiSize r) { return body::pvxiTranspose_8u_C1R(s, ss, d, ds, r); }
-inline PvxStatus TransposeC1(const Pvx16u* s, int ss, Pvx16u* d, int ds, PvxiSize r) { return body::pvxiTranspose_16u_C1R(s, ss, d, ds, r); }
-inline PvxStatus TransposeC1(const Pvx16s* s, int ss, Pvx16s* d, int ds, PvxiSize r) { return body::pvxiTranspose_16s_C1R(s, ss, d, ds, r); }
-inline PvxStatus TransposeC1(const Pvx32s* s, int ss, Pvx32s* d, int ds, PvxiSize r) { return body::pvxiTranspose_32s_C1R(s, ss, d, ds, r); }
-inline PvxStatus TransposeC1(const Pvx32f* s, int ss, Pvx32f* d, int ds, PvxiSize r) { return body::pvxiTranspose_32f_C1R(s, ss, d, ds, r); }
+inline PvxStatus TransposeC1(const Pvx8u* s, int ss, Pvx8u* d, int ds, PvxiSize r)
+{
+    return body::pvxiTranspose_8u_C1R(s, ss, d, ds, r);
+}
+inline PvxStatus TransposeC1(const Pvx16u* s, int ss, Pvx16u* d, int ds, PvxiSize r)
+{
+    return body::pvxiTranspose_16u_C1R(s, ss, d, ds, r);
+}
+inline PvxStatus TransposeC1(const Pvx16s* s, int ss, Pvx16s* d, int ds, PvxiSize r)
+{
+    return body::pvxiTranspose_16s_C1R(s, ss, d, ds, r);
+}
+inline PvxStatus TransposeC1(const Pvx32s* s, int ss, Pvx32s* d, int ds, PvxiSize r)
+{
+    return body::pvxiTranspose_32s_C1R(s, ss, d, ds, r);
+}
+inline PvxStatus TransposeC1(const Pvx32f* s, int ss, Pvx32f* d, int ds, PvxiSize r)
+{
+    return body::pvxiTranspose_32f_C1R(s, ss, d, ds, r);
+}
 
 // Pixel of C channels of E bytes; AC4 (kAlpha) moves the first three only.
 // A reversal block is four vectors, or three when a pixel does not divide 16.
@@ -103,8 +118,9 @@ inline void Put(Bytes* p, VI v)
 }
 
 // Copies n bytes of one row (flip 0), 64 bytes a step; AC4 blends the
-// destination alpha back (n and the start are whole pixels there). Streaming stores start where the destination is aligned (AC4 rows are
-// streamed only when their start is aligned).
+// destination alpha back (n and the start are whole pixels there). Streaming
+// stores start where the destination is aligned (AC4 rows are streamed only
+// when their start is aligned).
 template <class Px, bool kAlpha, int S>
 void CopyRow(const Bytes* s, Bytes* d, std::ptrdiff_t n, VI alpha)
 {

@@ -149,13 +149,14 @@ template <int PS, int K> inline constexpr int kSmaller = (PS == 1 && K == 16) ? 
 template <int PS, int K = kBlock<PS>>
 void TransposeRegion(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdiff_t ds, int w, int h)
 {
+    constexpr std::ptrdiff_t ps = PS;
     int wk = w / K * K, hk = h / K * K;
     for (int x = 0; x < wk; x += K)
-        for (int y = 0; y < hk; y += K) Block<PS, K>(src + ss * y + x * PS, ss, dst + ds * x + y * PS, ds);
+        for (int y = 0; y < hk; y += K) Block<PS, K>(src + ss * y + x * ps, ss, dst + ds * x + y * ps, ds);
     if constexpr (K > 1) {
         constexpr int K2 = kSmaller<PS, K>;
-        if (wk < w) TransposeRegion<PS, K2>(src + wk * PS, ss, dst + ds * wk, ds, w - wk, h);
-        if (hk < h && wk > 0) TransposeRegion<PS, K2>(src + ss * hk, ss, dst + hk * PS, ds, wk, h - hk);
+        if (wk < w) TransposeRegion<PS, K2>(src + wk * ps, ss, dst + ds * wk, ds, w - wk, h);
+        if (hk < h && wk > 0) TransposeRegion<PS, K2>(src + ss * hk, ss, dst + hk * ps, ds, wk, h - hk);
     }
 }
 
@@ -168,10 +169,11 @@ template <int PS> inline constexpr int kTile = PS <= 3 ? 64 : PS <= 8 ? 32 : 16;
 template <int PS>
 void TransposeTiled(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdiff_t ds, int w, int h)
 {
+    constexpr std::ptrdiff_t ps = PS;
     constexpr int T = kTile<PS>;
     for (int ty = 0; ty < h; ty += T)
         for (int tx = 0; tx < w; tx += T)
-            TransposeRegion<PS>(src + ss * ty + tx * PS, ss, dst + ds * tx + ty * PS, ds, std::min(T, w - tx),
+            TransposeRegion<PS>(src + ss * ty + tx * ps, ss, dst + ds * tx + ty * ps, ds, std::min(T, w - tx),
                                 std::min(T, h - ty));
 }
 
@@ -189,15 +191,16 @@ inline void StreamBytes(Bytes* d, const Bytes* s, std::ptrdiff_t n)
 template <int PS>
 void TransposeStreaming(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdiff_t ds, int w, int h)
 {
+    constexpr std::ptrdiff_t ps = PS;
     constexpr int T = PS <= 4 ? 64 : 32;
     alignas(64) Bytes buf[T * T * PS];
     for (int tx = 0; tx < w; tx += T) {
         int tw = std::min(T, w - tx);
         for (int ty = 0; ty < h; ty += T) {
             int th = std::min(T, h - ty);
-            std::ptrdiff_t bs = static_cast<std::ptrdiff_t>(th) * PS;
-            TransposeRegion<PS>(src + ss * ty + tx * PS, ss, buf, bs, tw, th);
-            for (int r = 0; r < tw; ++r) StreamBytes(dst + ds * (tx + r) + ty * PS, buf + bs * r, bs);
+            std::ptrdiff_t bs = th * ps;
+            TransposeRegion<PS>(src + ss * ty + tx * ps, ss, buf, bs, tw, th);
+            for (int r = 0; r < tw; ++r) StreamBytes(dst + ds * (tx + r) + ty * ps, buf + bs * r, bs);
         }
     }
     StoreFence();
@@ -209,18 +212,19 @@ void TransposeStreaming(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::pt
 template <int PS>
 void TransposeInPlace(Bytes* p, std::ptrdiff_t step, int n)
 {
+    constexpr std::ptrdiff_t ps = PS;
     constexpr int T = 32;
     alignas(64) Bytes buf[T * T * PS];
     for (int ty = 0; ty < n; ty += T) {
         int th = std::min(T, n - ty);
-        std::ptrdiff_t bs = static_cast<std::ptrdiff_t>(th) * PS;
-        Bytes* diag = p + step * ty + ty * PS;
+        std::ptrdiff_t bs = th * ps;
+        Bytes* diag = p + step * ty + ty * ps;
         TransposeRegion<PS>(diag, step, buf, bs, th, th);
         for (int r = 0; r < th; ++r) std::memcpy(diag + step * r, buf + bs * r, bs);
         for (int tx = ty + T; tx < n; tx += T) {
             int tw = std::min(T, n - tx);
-            Bytes* a = p + step * ty + tx * PS;  // th rows, tw columns
-            Bytes* b = p + step * tx + ty * PS;  // tw rows, th columns
+            Bytes* a = p + step * ty + tx * ps;  // th rows, tw columns
+            Bytes* b = p + step * tx + ty * ps;  // tw rows, th columns
             TransposeRegion<PS>(a, step, buf, bs, tw, th);
             TransposeRegion<PS>(b, step, a, step, th, tw);
             for (int r = 0; r < tw; ++r) std::memcpy(b + step * r, buf + bs * r, bs);
