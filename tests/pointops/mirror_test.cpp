@@ -5,10 +5,13 @@
 #include <array>
 
 #include "harness.h"
+#include "ref/move_ref.h"
 
 namespace {
 
 using namespace pvxtest;
+using pvxref::RefDiagonal;
+using pvxref::RefMirror;
 
 template <class T>
 using MirrorFn = PvxStatus (*)(const T*, int, T*, int, PvxiSize, int);
@@ -34,37 +37,6 @@ const Members<Pvx32f> k32f{{pvxiMirror_32f_C1R, pvxiMirror_32f_C3R, pvxiMirror_3
 
 const char* const kLayoutNames[4] = {"C1", "C3", "C4", "AC4"};
 const int kMemChannels[4] = {1, 3, 4, 4};
-
-// Reference for flips 0..2 on packed arrays: destination (x, y) takes source
-// (x or W-1-x, y or H-1-y); the fourth channel of AC4 keeps the destination's
-// value.
-template <class T>
-std::vector<T> RefMirror(const std::vector<T>& src, const std::vector<T>& dstBefore, int w, int h, int ch, bool alpha,
-                         int flip)
-{
-    std::vector<T> out = dstBefore;
-    for (int y = 0; y < h; ++y)
-        for (int x = 0; x < w; ++x) {
-            int sx = flip == 0 ? x : w - 1 - x, sy = flip == 1 ? y : h - 1 - y;
-            for (int c = 0; c < (alpha ? 3 : ch); ++c)
-                out[(std::size_t(y) * w + x) * ch + c] = src[(std::size_t(sy) * w + sx) * ch + c];
-        }
-    return out;
-}
-
-// Diagonals: the destination is h x w; flip 3 takes source (y, x), flip 4
-// source (w-1-y, h-1-x).
-template <class T>
-std::vector<T> RefDiagonal(const std::vector<T>& src, int w, int h, int flip)
-{
-    std::vector<T> out(src.size());
-    for (int y = 0; y < w; ++y)
-        for (int x = 0; x < h; ++x) {
-            int sx = flip == 3 ? y : w - 1 - y, sy = flip == 3 ? x : h - 1 - x;
-            out[std::size_t(y) * h + x] = src[std::size_t(sy) * w + sx];
-        }
-    return out;
-}
 
 bool ChangesNothing(Shape s, int flip)
 {

@@ -9,6 +9,7 @@
 #include <atomic>
 
 #include "harness.h"
+#include "ref/move_ref.h"
 
 namespace {
 
@@ -43,30 +44,8 @@ extern "C" PvxStatus pvxGetMaxCacheSizeB(int* pSizeByte)
 namespace {
 
 using namespace pvxtest;
-
-template <class T>
-std::vector<T> RefTranspose(const std::vector<T>& src, int w, int h, int ch)
-{
-    std::vector<T> out(src.size());
-    for (int y = 0; y < w; ++y)
-        for (int x = 0; x < h; ++x)
-            for (int c = 0; c < ch; ++c) out[(std::size_t(y) * h + x) * ch + c] = src[(std::size_t(x) * w + y) * ch + c];
-    return out;
-}
-
-template <class T>
-std::vector<T> RefMirror(const std::vector<T>& src, const std::vector<T>& dstBefore, int w, int h, int ch, bool alpha,
-                         int flip)
-{
-    std::vector<T> out = dstBefore;
-    for (int y = 0; y < h; ++y)
-        for (int x = 0; x < w; ++x) {
-            int sx = flip == 0 ? x : w - 1 - x, sy = flip == 1 ? y : h - 1 - y;
-            for (int c = 0; c < (alpha ? 3 : ch); ++c)
-                out[(std::size_t(y) * w + x) * ch + c] = src[(std::size_t(sy) * w + sx) * ch + c];
-        }
-    return out;
-}
+using pvxref::RefMirror;
+using pvxref::RefTranspose;
 
 constexpr int kCache = 300000;  // above the Transpose threshold, below Mirror's
 

@@ -4,10 +4,12 @@
 #include <array>
 
 #include "harness.h"
+#include "ref/move_ref.h"
 
 namespace {
 
 using namespace pvxtest;
+using pvxref::RefTranspose;
 
 template <class T>
 using TransposeFn = PvxStatus (*)(const T*, int, T*, int, PvxiSize);
@@ -32,18 +34,6 @@ const Members<Pvx32f> k32f{{pvxiTranspose_32f_C1R, pvxiTranspose_32f_C3R, pvxiTr
                            {pvxiTranspose_32f_C1IR, pvxiTranspose_32f_C3IR, pvxiTranspose_32f_C4IR}};
 
 const int kChannels[3] = {1, 3, 4};
-
-// Reference: destination pixel (x, y) of the h x w result is source pixel
-// (y, x) of the w x h source; packed arrays of `ch` elements per pixel.
-template <class T>
-std::vector<T> RefTranspose(const std::vector<T>& src, int w, int h, int ch)
-{
-    std::vector<T> out(src.size());
-    for (int y = 0; y < w; ++y)
-        for (int x = 0; x < h; ++x)
-            for (int c = 0; c < ch; ++c) out[(std::size_t(y) * h + x) * ch + c] = src[(std::size_t(x) * w + y) * ch + c];
-    return out;
-}
 
 // Sides around every block size (2, 4, 8, 16) and the tiles (16, 32, 64).
 std::vector<Shape> TransposeShapes(Rng& rng, int count)
