@@ -29,6 +29,7 @@ inline void StoreA(void* p, VI v) { _mm_store_si128(static_cast<VI*>(p), v); }
 inline void StoreNt(void* p, VI v) { _mm_stream_si128(static_cast<VI*>(p), v); }
 inline void StoreLo64(void* p, VI v) { _mm_storel_epi64(static_cast<VI*>(p), v); }
 inline void StoreFence() { _mm_sfence(); }
+inline void StoreHi64(void* p, VI v) { _mm_storel_epi64(static_cast<VI*>(p), _mm_unpackhi_epi64(v, v)); }
 
 inline VF LoadUF(const float* p) { return _mm_loadu_ps(p); }
 inline VF LoadAF(const float* p) { return _mm_load_ps(p); }
@@ -68,6 +69,15 @@ inline void Transpose4x32(VI& a, VI& b, VI& c, VI& d)
     c = _mm_unpacklo_epi64(t2, t3);
     d = _mm_unpackhi_epi64(t2, t3);
 }
+// Interleaving of the low or high halves of a and b, by element width.
+inline VI InterleaveLo8(VI a, VI b) { return _mm_unpacklo_epi8(a, b); }
+inline VI InterleaveHi8(VI a, VI b) { return _mm_unpackhi_epi8(a, b); }
+inline VI InterleaveLo16(VI a, VI b) { return _mm_unpacklo_epi16(a, b); }
+inline VI InterleaveHi16(VI a, VI b) { return _mm_unpackhi_epi16(a, b); }
+inline VI InterleaveLo32(VI a, VI b) { return _mm_unpacklo_epi32(a, b); }
+inline VI InterleaveHi32(VI a, VI b) { return _mm_unpackhi_epi32(a, b); }
+inline VI InterleaveLo64(VI a, VI b) { return _mm_unpacklo_epi64(a, b); }
+inline VI InterleaveHi64(VI a, VI b) { return _mm_unpackhi_epi64(a, b); }
 
 // ---- integer arithmetic ----
 inline VI AddSatU8(VI a, VI b) { return _mm_adds_epu8(a, b); }
@@ -117,8 +127,6 @@ inline VI PackUsS16(VI a, VI b) { return _mm_packus_epi16(a, b); }  // s16 -> u8
 inline VI PackSsS16(VI a, VI b) { return _mm_packs_epi16(a, b); }   // s16 -> s8, saturating
 inline VI PackUsS32(VI a, VI b) { return _mm_packus_epi32(a, b); }  // s32 -> u16, saturating
 inline VI PackSsS32(VI a, VI b) { return _mm_packs_epi32(a, b); }   // s32 -> s16, saturating
-inline VI InterleaveLo16(VI a, VI b) { return _mm_unpacklo_epi16(a, b); }
-inline VI InterleaveHi16(VI a, VI b) { return _mm_unpackhi_epi16(a, b); }
 
 // ---- float ----
 inline VF AddF(VF a, VF b) { return _mm_add_ps(a, b); }

@@ -112,8 +112,8 @@ typedef enum {
 
 /* Mirror axes. pvxAxsDiagonal (3) is the main diagonal: destination (x, y) is
  * source (y, x). pvxAxsAntiDiagonal (4) is the other one: destination (x, y)
- * is source (H-1-y, W-1-x) for a W x H source. The diagonals are served by
- * the one-channel not-in-place Mirror members only. */
+ * is source (W-1-y, H-1-x) for a W x H source (an H x W destination). The
+ * diagonals are served by the one-channel not-in-place Mirror members only. */
 typedef enum {
     pvxAxsHorizontal   = 0, /* top and bottom exchanged */
     pvxAxsVertical     = 1, /* left and right exchanged */

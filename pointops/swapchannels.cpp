@@ -1,0 +1,181 @@
+// SwapChannels: reorders the channels of every pixel.
+//
+// Destination channel i receives source channel dstOrder[i]. The order arrays:
+//   C3R, C3IR  3 entries, each 0..2
+//   C4R, C4IR  4 entries, each 0..3
+//   AC4R       3 entries, each 0..2; the destination alpha is never written
+//   C3C4R      4 entries, each 0..3; an entry of 3 leaves that destination
+//              channel as it was ({2, 1, 0, 3} turns BGR into RGBA and keeps
+//              the alpha already in the destination)
+//   C4C3R      3 entries, each 0..3
+// Entries are compared as unsigned numbers, so a negative entry is refused
+// like a large one (-60); every entry is checked before any pixel is written.
+// When pSrc equals pDst the C3R, C4R and AC4R forms run in place on the
+// destination rows (dstStep), whatever srcStep is. C3C4R and C4C3R change
+// the pixel size and have no in-place meaning: their regions must not overlap.
+//
+// Kernels work on bytes, templated by element size, so 16s/16u and 32s/32f
+// share them and 32f values move as bit patterns.
+#include "check.h"
+#include "entry.h"
+#include "layout.h"
+#include "shuffle.h"
+#include "simd.h"
+
+namespace pvx {
+namespace {
+
+using namespace simd;
+
+// Source and destination channels in memory, entries of the order array and
+// the bound that every entry must stay below (as an unsigned number).
+template <Lay L> struct SwapForm;
+template <> struct SwapForm<Lay::C3>   { static constexpr int kIn = 3, kOut = 3, kEntries = 3, kBound = 3; };
+template <> struct SwapForm<Lay::C4>   { static constexpr int kIn = 4, kOut = 4, kEntries = 4, kBound = 4; };
+template <> struct SwapForm<Lay::AC4>  { static constexpr int kIn = 4, kOut = 4, kEntries = 3, kBound = 3; };
+template <> struct SwapForm<Lay::C3C4> { static constexpr int kIn = 3, kOut = 4, kEntries = 4, kBound = 4; };
+template <> struct SwapForm<Lay::C4C3> { static constexpr int kIn = 4, kOut = 3, kEntries = 3, kBound = 4; };
+
+constexpr int kKeep = -1;  // destination channel left as it was
+
+// The order as the kernels see it: one source channel per destination
+// channel, or kKeep (AC4 alpha, an entry of 3 in C3C4).
+template <Lay L>
+void NormalizeOrder(const int* dstOrder, int* ord)
+{
+    using F = SwapForm<L>;
+    for (int c = 0; c < F::kOut; ++c) ord[c] = kKeep;
+    for (int c = 0; c < F::kEntries; ++c) ord[c] = dstOrder[c];
+    if constexpr (L == Lay::C3C4)
+        for (int c = 0; c < 4; ++c)
+            if (ord[c] == 3) ord[c] = kKeep;
+}
+
+template <Lay L>
+PvxStatus CheckOrder(const int* dstOrder)
+{
+    using F = SwapForm<L>;
+    for (int c = 0; c < F::kEntries; ++c)
+        if (static_cast<unsigned>(dstOrder[c]) >= static_cast<unsigned>(F::kBound)) return pvxStsChannelOrderErr;
+    return pvxStsNoErr;
+}
+
+// Masks of one block of 16 / E pixels: the shuffles, and the bytes of kept
+// destination channels.
+template <int E, int Cin, int Cout>
+struct SwapPlan {
+    ShufflePlan<Cin, Cout> shuffle;
+    VI keep[Cout];
+    bool anyKeep = false;
+
+    explicit SwapPlan(const int* ord)
+    {
+        int srcOf[16 * Cout];
+        alignas(16) std::uint8_t keepBytes[16 * Cout];
+        for (int b = 0; b < 16 * Cout; ++b) {
+            int p = b / (Cout * E), c = (b / E) % Cout, e = b % E;
+            bool kept = ord[c] == kKeep;
+            srcOf[b] = kept ? -1 : p * Cin * E + ord[c] * E + e;
+            keepBytes[b] = kept ? 0xFF : 0;
+            anyKeep = anyKeep || kept;
+        }
+        BuildShufflePlan(shuffle, srcOf);
+        for (int k = 0; k < Cout; ++k) keep[k] = LoadA(keepBytes + 16 * k);
+    }
+};
+
+// Reorders `width` pixels of Cin channels into Cout channels, 16 / E pixels a
+// step; kept channels are blended back from the destination. Every block is
+// loaded before it is stored, and the scalar tail reads a whole pixel before
+// writing it, so src == dst (same pixel size) works in place.
+template <int E, int Cin, int Cout, bool kKeepAny, bool A>
+void SwapRow(const std::uint8_t* src, std::uint8_t* dst, std::ptrdiff_t width, const SwapPlan<E, Cin, Cout>& plan,
+             const int* ord)
+{
+    using Geo = ReorderGeometry<E, Cin, Cout>;
+    constexpr int P = Geo::kPixels;
+    std::ptrdiff_t x = 0;
+    for (; x + P <= width; x += P) {
+        const std::uint8_t* s = src + x * Cin * E;
+        std::uint8_t* d = dst + x * Cout * E;
+        VI in[Cin], out[Cout];
+        for (int j = 0; j < Cin; ++j) in[j] = Load<A>(s + 16 * j);
+        ShuffleBlock<Geo>(in, out, plan.shuffle);
+        if constexpr (kKeepAny)
+            for (int k = 0; k < Cout; ++k) out[k] = SelectBytes(out[k], Load<A>(d + 16 * k), plan.keep[k]);
+        for (int k = 0; k < Cout; ++k) Store<A>(d + 16 * k, out[k]);
+    }
+    for (; x < width; ++x) {
+        std::uint8_t px[4 * E];
+        std::memcpy(px, src + x * Cin * E, Cin * E);
+        std::uint8_t* d = dst + x * Cout * E;
+        for (int c = 0; c < Cout; ++c)
+            if (ord[c] != kKeep) MoveElem<E>(d + c * E, px + ord[c] * E);
+    }
+}
+
+template <int E, int Cin, int Cout>
+void RunSwap(const std::uint8_t* src, std::ptrdiff_t srcStep, std::uint8_t* dst, std::ptrdiff_t dstStep, PvxiSize roi,
+             const int* ord)
+{
+    SwapPlan<E, Cin, Cout> plan(ord);
+    std::ptrdiff_t width = roi.width;
+    int rows = roi.height;
+    if (srcStep == width * Cin * E && dstStep == width * Cout * E) {
+        width *= rows;
+        rows = 1;
+    }
+    for (int y = 0; y < rows; ++y) {
+        const std::uint8_t* s = src + srcStep * y;
+        std::uint8_t* d = dst + dstStep * y;
+        bool aligned = IsAligned(s) && IsAligned(d);
+        if (plan.anyKeep) {
+            if (aligned) SwapRow<E, Cin, Cout, true, true>(s, d, width, plan, ord);
+            else SwapRow<E, Cin, Cout, true, false>(s, d, width, plan, ord);
+        } else {
+            if (aligned) SwapRow<E, Cin, Cout, false, true>(s, d, width, plan, ord);
+            else SwapRow<E, Cin, Cout, false, false>(s, d, width, plan, ord);
+        }
+    }
+}
+
+template <class T, Lay L>
+void Swap(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi, const int* dstOrder)
+{
+    int ord[4];
+    NormalizeOrder<L>(dstOrder, ord);
+    RunSwap<sizeof(T), SwapForm<L>::kIn, SwapForm<L>::kOut>(reinterpret_cast<const std::uint8_t*>(pSrc), srcStep,
+                                                            reinterpret_cast<std::uint8_t*>(pDst), dstStep, roi, ord);
+}
+
+template <class T, Lay L>
+PvxStatus SwapChannelsBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi, const int* dstOrder)
+{
+    if (PvxStatus s = CheckPtrs({pSrc, pDst, dstOrder})) return s;
+    if (PvxStatus s = CheckRoi(roi)) return s;
+    if (PvxStatus s = CheckStepsNonZero({srcStep, dstStep})) return s;
+    if (PvxStatus s = CheckOrder<L>(dstOrder)) return s;
+    // Same pointer, same pixel size: in place on the destination rows.
+    if (SwapForm<L>::kIn == SwapForm<L>::kOut && pSrc == pDst) srcStep = dstStep;
+    Swap<T, L>(pSrc, srcStep, pDst, dstStep, roi, dstOrder);
+    return pvxStsNoErr;
+}
+
+// In place: the step is checked before the sizes, and the order pointer after
+// them, as callers of the in-place forms rely on.
+template <class T, Lay L>
+PvxStatus SwapChannelsInPlaceBody(T* pSrcDst, int srcDstStep, PvxiSize roi, const int* dstOrder)
+{
+    if (PvxStatus s = CheckPtrs({pSrcDst})) return s;
+    if (PvxStatus s = CheckStepsNonZero({srcDstStep})) return s;
+    if (PvxStatus s = CheckRoi(roi)) return s;
+    if (PvxStatus s = CheckPtrs({dstOrder})) return s;
+    if (PvxStatus s = CheckOrder<L>(dstOrder)) return s;
+    Swap<T, L>(pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi, dstOrder);
+    return pvxStsNoErr;
+}
+
+}  // namespace
+}  // namespace pvx
+
+#include "swapchannels.exports.inc"

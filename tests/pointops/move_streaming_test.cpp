@@ -1,0 +1,116 @@
+// Large regions of Transpose and Mirror are written with non-temporal stores
+// when they are at least as large as the largest cache; the pixels must be
+// the same as with ordinary stores. Real caches are tens of megabytes, so this
+// file stands in for the core library's cache query: the library calls
+// pvxGetMaxCacheSizeB through the dynamic linker, which finds this definition
+// first. Unless a test sets a size, it forwards to the core library.
+#include <dlfcn.h>
+
+#include <atomic>
+
+#include "harness.h"
+#include "ref/move_ref.h"
+
+namespace {
+
+std::atomic<int> gCacheBytes{0};
+std::atomic<int> gCacheQueries{0};
+
+// Sets the reported cache size for one scope.
+struct SmallCache {
+    explicit SmallCache(int bytes)
+    {
+        gCacheBytes = bytes;
+        gCacheQueries = 0;
+    }
+    ~SmallCache() { gCacheBytes = 0; }
+};
+
+}  // namespace
+
+extern "C" PvxStatus pvxGetMaxCacheSizeB(int* pSizeByte)
+{
+    if (int bytes = gCacheBytes.load()) {
+        ++gCacheQueries;
+        if (!pSizeByte) return pvxStsNullPtrErr;
+        *pSizeByte = bytes;
+        return pvxStsNoErr;
+    }
+    using Fn = PvxStatus (*)(int*);
+    static const Fn real = reinterpret_cast<Fn>(dlsym(RTLD_NEXT, "pvxGetMaxCacheSizeB"));
+    return real(pSizeByte);
+}
+
+namespace {
+
+using namespace pvxtest;
+using pvxref::RefMirror;
+using pvxref::RefTranspose;
+
+constexpr int kCache = 300000;  // above the Transpose threshold, below Mirror's
+
+template <class T>
+void TransposeLarge(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize), int ch, int w, int h, std::uint64_t seed)
+{
+    SCOPED_TRACE(::testing::Message() << "Transpose " << sizeof(T) << "-byte C" << ch << " " << w << "x" << h);
+    Rng rng = MakeRng(seed);
+    for (bool aligned : {true, false}) {
+        ShapeOptions o{!aligned, !aligned, false, 0};
+        GuardedImage src = MakeImage<T>(w, h, ch, rng, o), dst = MakeImage<T>(h, w, ch, rng, o);
+        SmallCache cache(kCache);
+        ASSERT_EQ(fn(src.ptr<T>(), src.step(), dst.ptr<T>(), dst.step(), {w, h}), pvxStsNoErr);
+        EXPECT_GT(gCacheQueries.load(), 0);
+        EXPECT_TRUE(RegionEquals(dst, RefTranspose(src.Packed<T>(), w, h, ch)));
+    }
+}
+
+TEST(MoveStreaming, TransposeLargeRegions)
+{
+    TransposeLarge(pvxiTranspose_8u_C1R, 1, 701, 467, 1);
+    TransposeLarge(pvxiTranspose_16u_C1R, 1, 480, 333, 2);
+    TransposeLarge(pvxiTranspose_8u_C3R, 3, 333, 310, 3);
+    TransposeLarge(pvxiTranspose_32f_C1R, 1, 300, 261, 4);
+    TransposeLarge(pvxiTranspose_16s_C3R, 3, 230, 221, 5);
+    TransposeLarge(pvxiTranspose_16u_C4R, 4, 211, 190, 6);
+    TransposeLarge(pvxiTranspose_32s_C3R, 3, 171, 150, 7);
+    TransposeLarge(pvxiTranspose_32f_C4R, 4, 133, 141, 8);
+}
+
+template <class T>
+void MirrorLarge(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int), bool alpha, int w, int h, std::uint64_t seed)
+{
+    Rng rng = MakeRng(seed);
+    for (int flip = 0; flip < 3; ++flip)
+        for (bool aligned : {true, false}) {
+            SCOPED_TRACE(::testing::Message() << "Mirror " << sizeof(T) << "-byte " << (alpha ? "AC4" : "C4") << " "
+                                              << w << "x" << h << " flip " << flip << " aligned " << aligned);
+            ShapeOptions o{!aligned, !aligned, false, 0};
+            GuardedImage src = MakeImage<T>(w, h, 4, rng, o), dst = MakeImage<T>(w, h, 4, rng, o);
+            SmallCache cache(kCache);
+            ASSERT_EQ(fn(src.ptr<T>(), src.step(), dst.ptr<T>(), dst.step(), {w, h}, flip), pvxStsNoErr);
+            EXPECT_GT(gCacheQueries.load(), 0);
+            EXPECT_TRUE(RegionEquals(dst, RefMirror(src.Packed<T>(), dst.Packed<T>(), w, h, 4, alpha, flip)));
+        }
+}
+
+TEST(MoveStreaming, MirrorLargeFourChannelRegions)
+{
+    MirrorLarge(pvxiMirror_8u_C4R, false, 400, 333, 11);
+    MirrorLarge(pvxiMirror_8u_AC4R, true, 397, 345, 12);
+    MirrorLarge(pvxiMirror_16s_C4R, false, 260, 257, 13);
+    MirrorLarge(pvxiMirror_16u_AC4R, true, 263, 255, 14);
+    MirrorLarge(pvxiMirror_32f_C4R, false, 190, 181, 15);
+    MirrorLarge(pvxiMirror_32s_AC4R, true, 181, 190, 16);
+}
+
+TEST(MoveStreaming, SmallRegionsDoNotAsk)
+{
+    // Below the thresholds the cache size is not needed.
+    std::vector<Pvx8u> a(64 * 64), b(64 * 64);
+    SmallCache cache(kCache);
+    ASSERT_EQ(pvxiTranspose_8u_C1R(a.data(), 64, b.data(), 64, {64, 64}), pvxStsNoErr);
+    ASSERT_EQ(pvxiMirror_8u_C4R(a.data(), 64, b.data(), 64, {16, 64}, 1), pvxStsNoErr);
+    EXPECT_EQ(gCacheQueries.load(), 0);
+}
+
+}  // namespace
