@@ -340,14 +340,165 @@ void DemoConvert(Run& run, const Inputs& in)
     }
 }
 
-// ---- further families ----------------------------------------------------------
-// Each family adds one function here in the style of DemoConvert and one line
-// in main():
-//   DemoMirror       pvxiMirror_*: the chart flipped about each axis
-//   DemoTranspose    pvxiTranspose_*: the chart with rows and columns swapped
-//   DemoSwapChannels pvxiSwapChannels_*: the chart as BGR and in other orders
-//   DemoArithmetic   pvxiAdd*/Sub*/Mul*/Div*: chart and zone plate combined,
-//                    with scale factors
+// ---- data movement -------------------------------------------------------------
+
+// Mirror: the chart flipped about each axis (the orange marker shows where the
+// top left corner went), and the zone plate about the main diagonal.
+void DemoMirror(Run& run, const Inputs& in)
+{
+    std::printf("\nMirror\n");
+    const struct {
+        int flip;
+        const char* file;
+        const char* what;
+    } kFlips[] = {{pvxAxsHorizontal, "mirror_chart_horizontal.png", "top and bottom exchanged"},
+                  {pvxAxsVertical, "mirror_chart_vertical.png", "left and right exchanged"},
+                  {pvxAxsBoth, "mirror_chart_both.png", "turned by 180 degrees"}};
+    Image<Pvx8u> out = Allocate(run, "pvxiMalloc_8u_C3", pvxiMalloc_8u_C3, kWidth, kHeight, 3);
+    if (!out.data) return;
+    for (const auto& f : kFlips) {
+        run.Call("pvxiMirror_8u_C3R(chart, flip " + std::to_string(f.flip) + ")",
+                 pvxiMirror_8u_C3R(in.chart8u.data, in.chart8u.step, out.data, out.step, in.chart8u.Size(), f.flip));
+        run.Write(f.file, out.data, out.step, kWidth, kHeight, 3, f.what);
+    }
+    Release(out);
+
+    // the diagonal flips exchange width and height; one-channel images only
+    Image<Pvx8u> diag = Allocate(run, "pvxiMalloc_8u_C1", pvxiMalloc_8u_C1, kHeight, kWidth, 1);
+    if (!diag.data) return;
+    run.Call("pvxiMirror_8u_C1R(zone plate, flip 3: main diagonal)",
+             pvxiMirror_8u_C1R(in.zone8u.data, in.zone8u.step, diag.data, diag.step, in.zone8u.Size(),
+                               pvxAxsDiagonal));
+    run.Write("mirror_zoneplate_diagonal.png", diag.data, diag.step, kHeight, kWidth, 1, "main diagonal");
+    run.Call("pvxiMirror_8u_C3R(chart, flip 3)",
+             pvxiMirror_8u_C3R(in.chart8u.data, in.chart8u.step, diag.data, diag.step, in.chart8u.Size(),
+                               pvxAxsDiagonal),
+             pvxStsMirrorFlipErr);
+    Release(diag);
+
+    // in place: the call with the same image on both sides is the in-place form
+    Image<Pvx8u> copy = Allocate(run, "pvxiMalloc_8u_C3", pvxiMalloc_8u_C3, kWidth, kHeight, 3);
+    if (!copy.data) return;
+    run.Call("pvxiCopy_8u_C3R(chart)",
+             pvxiCopy_8u_C3R(in.chart8u.data, in.chart8u.step, copy.data, copy.step, copy.Size()));
+    run.Call("pvxiMirror_8u_C3IR(copy of the chart, flip 1)",
+             pvxiMirror_8u_C3IR(copy.data, copy.step, copy.Size(), pvxAxsVertical));
+    run.Write("mirror_chart_vertical_in_place.png", copy.data, copy.step, kWidth, kHeight, 3,
+              "the same flip, in place");
+    run.Call("pvxiMirror_8u_C3IR(one row, flip 0: changes nothing)",
+             pvxiMirror_8u_C3IR(copy.data, copy.step, PvxiSize{kWidth, 1}, pvxAxsHorizontal), pvxStsSizeErr);
+    Release(copy);
+}
+
+// Transpose: the chart with rows and columns exchanged, out of place and, on a
+// square tile, in place.
+void DemoTranspose(Run& run, const Inputs& in)
+{
+    std::printf("\nTranspose\n");
+    Image<Pvx8u> out = Allocate(run, "pvxiMalloc_8u_C3", pvxiMalloc_8u_C3, kHeight, kWidth, 3);
+    if (!out.data) return;
+    run.Call("pvxiTranspose_8u_C3R(chart)",
+             pvxiTranspose_8u_C3R(in.chart8u.data, in.chart8u.step, out.data, out.step, in.chart8u.Size()));
+    run.Write("transpose_chart.png", out.data, out.step, kHeight, kWidth, 3, "rows and columns exchanged");
+    Release(out);
+
+    const int side = kHeight;  // the left square of the zone plate
+    Image<Pvx8u> tile = Allocate(run, "pvxiMalloc_8u_C1", pvxiMalloc_8u_C1, side, side, 1);
+    if (!tile.data) return;
+    run.Call("pvxiCopy_8u_C1R(left square of the zone plate)",
+             pvxiCopy_8u_C1R(in.zone8u.data, in.zone8u.step, tile.data, tile.step, tile.Size()));
+    run.Call("pvxiTranspose_8u_C1IR(square tile)", pvxiTranspose_8u_C1IR(tile.data, tile.step, tile.Size()));
+    run.Write("transpose_zoneplate_square_in_place.png", tile.data, tile.step, side, side, 1,
+              "square tile, transposed in place");
+    run.Call("pvxiTranspose_8u_C1IR(not square)",
+             pvxiTranspose_8u_C1IR(tile.data, tile.step, PvxiSize{side, side - 1}), pvxStsSizeErr);
+    Release(tile);
+}
+
+// SwapChannels and the planar copies: the chart as BGR, its green channel
+// repeated, and the three planes of the chart side by side.
+void DemoSwapChannels(Run& run, const Inputs& in)
+{
+    std::printf("\nSwapChannels and planar copies\n");
+    Image<Pvx8u> out = Allocate(run, "pvxiMalloc_8u_C3", pvxiMalloc_8u_C3, kWidth, kHeight, 3);
+    if (!out.data) return;
+    const int bgr[3] = {2, 1, 0}, green[3] = {1, 1, 1}, bad[3] = {0, 3, 1};
+    run.Call("pvxiSwapChannels_8u_C3R(chart, {2, 1, 0})",
+             pvxiSwapChannels_8u_C3R(in.chart8u.data, in.chart8u.step, out.data, out.step, out.Size(), bgr));
+    run.Write("swap_chart_bgr.png", out.data, out.step, kWidth, kHeight, 3, "red and blue exchanged");
+    run.Call("pvxiSwapChannels_8u_C3R(chart, {1, 1, 1})",
+             pvxiSwapChannels_8u_C3R(in.chart8u.data, in.chart8u.step, out.data, out.step, out.Size(), green));
+    run.Write("swap_chart_green.png", out.data, out.step, kWidth, kHeight, 3, "the green channel as grey");
+    run.Call("pvxiSwapChannels_8u_C3R(chart, {0, 3, 1})",
+             pvxiSwapChannels_8u_C3R(in.chart8u.data, in.chart8u.step, out.data, out.step, out.Size(), bad),
+             pvxStsChannelOrderErr);
+    Release(out);
+
+    // three planes stacked vertically in one grey image, then back to RGB
+    Image<Pvx8u> planes = Allocate(run, "pvxiMalloc_8u_C1", pvxiMalloc_8u_C1, kWidth, 3 * kHeight, 1);
+    Image<Pvx8u> back = Allocate(run, "pvxiMalloc_8u_C3", pvxiMalloc_8u_C3, kWidth, kHeight, 3);
+    if (!planes.data || !back.data) return;
+    Pvx8u* const p[3] = {planes.Row(0), planes.Row(kHeight), planes.Row(2 * kHeight)};
+    run.Call("pvxiCopy_8u_C3P3R(chart)",
+             pvxiCopy_8u_C3P3R(in.chart8u.data, in.chart8u.step, p, planes.step, in.chart8u.Size()));
+    run.Write("copy_chart_planes.png", planes.data, planes.step, kWidth, 3 * kHeight, 1, "red, green, blue planes");
+    const Pvx8u* const q[3] = {p[2], p[1], p[0]};
+    run.Call("pvxiCopy_8u_P3C3R(planes in the order b, g, r)",
+             pvxiCopy_8u_P3C3R(q, planes.step, back.data, back.step, back.Size()));
+    run.Write("copy_chart_from_planes_bgr.png", back.data, back.step, kWidth, kHeight, 3,
+              "planes merged in another order");
+    Release(planes);
+    Release(back);
+}
+
+// ---- arithmetic -------------------------------------------------------------------
+
+// Arithmetic with scale factors: the chart and the zone plate added with
+// halving (scale factor 1), their difference, a product scaled by 2^-8, and a
+// constant brightening that saturates.
+void DemoArithmetic(Run& run, const Inputs& in)
+{
+    std::printf("\nArithmetic\n");
+    Image<Pvx8u> zone3 = Allocate(run, "pvxiMalloc_8u_C3", pvxiMalloc_8u_C3, kWidth, kHeight, 3);
+    Image<Pvx8u> out = Allocate(run, "pvxiMalloc_8u_C3", pvxiMalloc_8u_C3, kWidth, kHeight, 3);
+    if (!zone3.data || !out.data) return;
+    run.Call("pvxiDup_8u_C1C3R(zone plate)",
+             pvxiDup_8u_C1C3R(in.zone8u.data, in.zone8u.step, zone3.data, zone3.step, zone3.Size()));
+    const PvxiSize size = out.Size();
+    run.Call("pvxiAdd_8u_C3RSfs(chart, zone plate, sf 1)",
+             pvxiAdd_8u_C3RSfs(in.chart8u.data, in.chart8u.step, zone3.data, zone3.step, out.data, out.step, size, 1));
+    run.Write("arith_add_halved.png", out.data, out.step, kWidth, kHeight, 3, "(chart + zone plate) / 2");
+    run.Call("pvxiSub_8u_C3RSfs(zone plate, chart, sf 0)",
+             pvxiSub_8u_C3RSfs(zone3.data, zone3.step, in.chart8u.data, in.chart8u.step, out.data, out.step, size, 0));
+    run.Write("arith_sub.png", out.data, out.step, kWidth, kHeight, 3, "chart - zone plate, saturated at 0");
+    run.Call("pvxiMul_8u_C3RSfs(chart, zone plate, sf 8)",
+             pvxiMul_8u_C3RSfs(in.chart8u.data, in.chart8u.step, zone3.data, zone3.step, out.data, out.step, size, 8));
+    run.Write("arith_mul.png", out.data, out.step, kWidth, kHeight, 3, "chart * zone plate / 256");
+    const Pvx8u brighter[3] = {96, 64, 32};
+    run.Call("pvxiAddC_8u_C3RSfs(chart, {96, 64, 32}, sf 0)",
+             pvxiAddC_8u_C3RSfs(in.chart8u.data, in.chart8u.step, brighter, out.data, out.step, size, 0));
+    run.Write("arith_addc.png", out.data, out.step, kWidth, kHeight, 3, "brightened, saturating at 255");
+    run.Call("pvxiAdd_8u_C3RSfs(sf 10: every result rounds to 0)",
+             pvxiAdd_8u_C3RSfs(in.chart8u.data, in.chart8u.step, zone3.data, zone3.step, out.data, out.step, size, 10));
+
+    // float: zone plate times itself, scaled back to 8u for viewing
+    Image<Pvx32f> sq = Allocate(run, "pvxiMalloc_32f_C1", pvxiMalloc_32f_C1, kWidth, kHeight, 1);
+    Image<Pvx8u> sq8 = Allocate(run, "pvxiMalloc_8u_C1", pvxiMalloc_8u_C1, kWidth, kHeight, 1);
+    if (sq.data && sq8.data) {
+        const Pvx32f inv255 = 1.0f / 255.0f;
+        run.Call("pvxiMul_32f_C1R(zone plate, zone plate)",
+                 pvxiMul_32f_C1R(in.zone32f.data, in.zone32f.step, in.zone32f.data, in.zone32f.step, sq.data, sq.step,
+                                 sq.Size()));
+        run.Call("pvxiMulC_32f_C1IR(1/255)", pvxiMulC_32f_C1IR(inv255, sq.data, sq.step, sq.Size()));
+        run.Call("pvxiConvert_32f8u_C1R(product)",
+                 pvxiConvert_32f8u_C1R(sq.data, sq.step, sq8.data, sq8.step, sq.Size(), pvxRndNearestEven));
+        run.Write("arith_zoneplate_squared.png", sq8.data, sq8.step, kWidth, kHeight, 1, "zone plate squared (float)");
+    }
+    Release(sq);
+    Release(sq8);
+    Release(zone3);
+    Release(out);
+}
 
 bool MakeDirectory(const std::string& dir)
 {
@@ -372,10 +523,10 @@ int main(int argc, char** argv)
     if (run.failures) return 1;
 
     DemoConvert(run, in);
-    // DemoMirror(run, in);
-    // DemoTranspose(run, in);
-    // DemoSwapChannels(run, in);
-    // DemoArithmetic(run, in);
+    DemoMirror(run, in);
+    DemoTranspose(run, in);
+    DemoSwapChannels(run, in);
+    DemoArithmetic(run, in);
 
     Release(in.zone32f);
     Release(in.zone8u);
