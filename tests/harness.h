@@ -196,6 +196,17 @@ inline std::vector<Shape> Shapes(Rng& rng, int count, int maxWidth = 300)
     return out;
 }
 
+// Every width from 1 to 67 (heights 1..3), then `extra` random widths up to
+// maxWidth (heights 1..5): the sweep for families whose kernels change with
+// the width modulo a vector.
+inline std::vector<Shape> WidthSweep(Rng& rng, int extra = 16, int maxWidth = 300)
+{
+    std::vector<Shape> out;
+    for (int w = 1; w <= 67; ++w) out.push_back({w, RandInt(rng, 1, 3)});
+    for (int i = 0; i < extra; ++i) out.push_back({RandInt(rng, 68, maxWidth), RandInt(rng, 1, 5)});
+    return out;
+}
+
 // ---- comparisons -------------------------------------------------------------
 
 // Exact comparison of a region with an expected packed array; reports the first

@@ -239,21 +239,12 @@ void RunCase(const Member& m, Shape s, Rng& rng)
     EXPECT_TRUE(mask.Unchanged());
 }
 
-// Widths 1..67, then random widths up to 300; heights from 1.
-std::vector<Shape> CopyShapes(Rng& rng)
-{
-    std::vector<Shape> out;
-    for (int w = 1; w <= 67; ++w) out.push_back({w, RandInt(rng, 1, 3)});
-    for (int i = 0; i < 16; ++i) out.push_back({RandInt(rng, 68, 300), RandInt(rng, 1, 5)});
-    return out;
-}
-
 TEST(Copy, EveryMemberAgainstReference)
 {
     std::uint64_t seed = 1;
     for (const Member& m : kMembers) {
         Rng rng = MakeRng(seed++);
-        for (Shape s : CopyShapes(rng)) {
+        for (Shape s : WidthSweep(rng)) {
             SCOPED_TRACE(::testing::Message() << m.name << " seed " << seed - 1 << " width " << s.width << " height "
                                               << s.height);
             RunCase(m, s, rng);

@@ -111,20 +111,12 @@ std::vector<Pvx8u> Expected(const Member& m, const GuardedImage& dst, const Guar
     return want;
 }
 
-std::vector<Shape> SetShapes(Rng& rng)
-{
-    std::vector<Shape> out;
-    for (int w = 1; w <= 67; ++w) out.push_back({w, RandInt(rng, 1, 3)});
-    for (int i = 0; i < 16; ++i) out.push_back({RandInt(rng, 68, 300), RandInt(rng, 1, 5)});
-    return out;
-}
-
 TEST(Set, EveryMemberAgainstReference)
 {
     std::uint64_t seed = 500;
     for (const Member& m : kMembers) {
         Rng rng = MakeRng(seed++);
-        for (Shape s : SetShapes(rng)) {
+        for (Shape s : WidthSweep(rng)) {
             const int w = s.width, h = s.height, S = m.elemBytes;
             ShapeOptions o;
             o.randomPad = RandInt(rng, 0, 2) != 0;
