@@ -322,6 +322,47 @@ PVX_API PvxStatus pvxiDiv_Round_16s_C3IRSfs(const Pvx16s* pSrc, int srcStep, Pvx
 PVX_API PvxStatus pvxiDiv_Round_16s_C4IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int roundMode, int scaleFactor);
 PVX_API PvxStatus pvxiDiv_Round_16s_AC4IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int roundMode, int scaleFactor);
 
+/* ==== pointops/mulscale.api ==== */
+
+/* ---- MulScale ---- */
+/* MulScale: the integer part of pSrc1 * pSrc2 / M, M = 255 (8u) or 65535 (16u), truncated, not rounded: */
+/* 255 * 255 gives 255, 128 * 1 gives 0. Checks pointers (-8), steps (-14), then sizes (-6). */
+PVX_API PvxStatus pvxiMulScale_8u_C1R(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_8u_C3R(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_8u_C4R(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_8u_AC4R(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_16u_C1R(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_16u_C3R(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_16u_C4R(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_16u_AC4R(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_8u_C1IR(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_8u_C3IR(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_8u_C4IR(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_8u_AC4IR(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_16u_C1IR(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_16u_C3IR(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_16u_C4IR(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulScale_16u_AC4IR(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
+/* ---- MulCScale ---- */
+/* MulCScale: the integer part of pSrc * value / M, as MulScale; in place: pSrcDst * value / M. */
+PVX_API PvxStatus pvxiMulCScale_8u_C1R(const Pvx8u* pSrc, int srcStep, Pvx8u value, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_16u_C1R(const Pvx16u* pSrc, int srcStep, Pvx16u value, Pvx16u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_8u_C3R(const Pvx8u* pSrc, int srcStep, const Pvx8u value[3], Pvx8u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_8u_C4R(const Pvx8u* pSrc, int srcStep, const Pvx8u value[4], Pvx8u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_8u_AC4R(const Pvx8u* pSrc, int srcStep, const Pvx8u value[3], Pvx8u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_16u_C3R(const Pvx16u* pSrc, int srcStep, const Pvx16u value[3], Pvx16u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_16u_C4R(const Pvx16u* pSrc, int srcStep, const Pvx16u value[4], Pvx16u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_16u_AC4R(const Pvx16u* pSrc, int srcStep, const Pvx16u value[3], Pvx16u* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_8u_C1IR(Pvx8u value, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_16u_C1IR(Pvx16u value, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_8u_C3IR(const Pvx8u value[3], Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_8u_C4IR(const Pvx8u value[4], Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_8u_AC4IR(const Pvx8u value[3], Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_16u_C3IR(const Pvx16u value[3], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_16u_C4IR(const Pvx16u value[4], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulCScale_16u_AC4IR(const Pvx16u value[3], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
 #ifdef __cplusplus
 }
 #endif

@@ -56,19 +56,19 @@ inline std::vector<Member> Members(const std::string& group)
     return out;
 }
 
-// Calls a pixel type named by a member's type code: f(T{}).
+// Calls f(T{}) for the pixel type T among Ts whose code is t.
+template <class... Ts, class F>
+void ForTypes(const std::string& t, F&& f)
+{
+    bool done = ((t == TypeName<Ts>() ? (f(Ts{}), true) : false) || ...);
+    if (!done) ADD_FAILURE() << "type " << t;
+}
+
+// Every pixel type of the arithmetic tables.
 template <class F>
 void ForTypeCode(const std::string& t, F&& f)
 {
-    if (t == "8u") f(Pvx8u{});
-    else if (t == "16u") f(Pvx16u{});
-    else if (t == "16s") f(Pvx16s{});
-    else if (t == "32s") f(Pvx32s{});
-    else if (t == "32f") f(Pvx32f{});
-    else if (t == "16sc") f(Pvx16sc{});
-    else if (t == "32sc") f(Pvx32sc{});
-    else if (t == "32fc") f(Pvx32fc{});
-    else ADD_FAILURE() << "type " << t;
+    ForTypes<Pvx8u, Pvx16u, Pvx16s, Pvx32s, Pvx32f, Pvx16sc, Pvx32sc, Pvx32fc>(t, f);
 }
 
 // The arguments of one call. Two images: a is src1, b src2, d the destination;
