@@ -363,6 +363,179 @@ PVX_API PvxStatus pvxiMulCScale_16u_C3IR(const Pvx16u value[3], Pvx16u* pSrcDst,
 PVX_API PvxStatus pvxiMulCScale_16u_C4IR(const Pvx16u value[4], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
 PVX_API PvxStatus pvxiMulCScale_16u_AC4IR(const Pvx16u value[3], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
 
+/* ==== pointops/unary.api ==== */
+
+/* ---- Abs ---- */
+/* Abs: |x|; the 16s value -32768 saturates to 32767. Checks pointers (-8), sizes (-6), steps (-14). */
+PVX_API PvxStatus pvxiAbs_16s_C1R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_16s_C3R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_16s_C4R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_16s_AC4R(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_32f_C1R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_32f_C3R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_32f_C4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_32f_AC4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_16s_C1IR(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_16s_C3IR(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_16s_C4IR(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_16s_AC4IR(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_32f_C1IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_32f_C3IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_32f_C4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiAbs_32f_AC4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
+/* ---- Sqr ---- */
+/* Sqr: x * x; integer members: times 2^-scaleFactor, rounded half to even, saturated. */
+/* Checks pointers (-8), sizes (-6), steps (-14). */
+PVX_API PvxStatus pvxiSqr_8u_C1RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_8u_C3RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_8u_C4RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_8u_AC4RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16u_C1RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16u_C3RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16u_C4RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16u_AC4RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16s_C1RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16s_C3RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16s_C4RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16s_AC4RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_8u_C1IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_8u_C3IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_8u_C4IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_8u_AC4IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16u_C1IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16u_C3IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16u_C4IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16u_AC4IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16s_C1IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16s_C3IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16s_C4IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_16s_AC4IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqr_32f_C1R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqr_32f_C3R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqr_32f_C4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqr_32f_AC4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqr_32f_C1IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqr_32f_C3IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqr_32f_C4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqr_32f_AC4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
+/* ---- Sqrt ---- */
+/* Sqrt: the square root; integer members: the exact root times 2^-scaleFactor, rounded half to even, */
+/* saturated; a negative 16s value gives 0. 32f: correctly rounded, NaN for negative values. */
+/* Checks pointers (-8), sizes (-6), steps (-14); the 32f members check steps before sizes. */
+PVX_API PvxStatus pvxiSqrt_8u_C1RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_8u_C3RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_8u_C4RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_8u_AC4RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16u_C1RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16u_C3RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16u_C4RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16u_AC4RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16s_C1RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16s_C3RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16s_C4RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16s_AC4RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_8u_C1IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_8u_C3IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_8u_C4IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_8u_AC4IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16u_C1IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16u_C3IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16u_C4IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16u_AC4IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16s_C1IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16s_C3IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16s_C4IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_16s_AC4IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSqrt_32f_C1R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqrt_32f_C3R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqrt_32f_C4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqrt_32f_AC4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqrt_32f_C1IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqrt_32f_C3IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqrt_32f_C4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSqrt_32f_AC4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
+/* ---- Exp ---- */
+/* Exp: e^x; integer members: times 2^-scaleFactor, rounded half to even, saturated. 32f: expf of each */
+/* element. Checks pointers (-8), sizes (-6), steps (-14). */
+PVX_API PvxStatus pvxiExp_8u_C1RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_8u_C3RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_8u_C4RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_8u_AC4RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16u_C1RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16u_C3RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16u_C4RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16u_AC4RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16s_C1RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16s_C3RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16s_C4RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16s_AC4RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_8u_C1IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_8u_C3IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_8u_C4IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_8u_AC4IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16u_C1IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16u_C3IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16u_C4IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16u_AC4IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16s_C1IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16s_C3IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16s_C4IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_16s_AC4IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiExp_32f_C1R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiExp_32f_C3R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiExp_32f_C4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiExp_32f_AC4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiExp_32f_C1IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiExp_32f_C3IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiExp_32f_C4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiExp_32f_AC4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
+/* ---- Ln ---- */
+/* Ln: the natural logarithm; integer members: times 2^-scaleFactor, rounded half to even, saturated; */
+/* ln 0 gives the type's minimum (0 unsigned), a negative 16s value gives 0. 32f: logf of each element. */
+/* A call that met a 0 returns pvxStsDivByZero (6). Checks pointers (-8), sizes (-6), steps (-14). */
+PVX_API PvxStatus pvxiLn_8u_C1RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_8u_C3RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_8u_C4RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_8u_AC4RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16u_C1RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16u_C3RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16u_C4RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16u_AC4RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16s_C1RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16s_C3RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16s_C4RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16s_AC4RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_8u_C1IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_8u_C3IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_8u_C4IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_8u_AC4IRSfs(Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16u_C1IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16u_C3IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16u_C4IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16u_AC4IRSfs(Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16s_C1IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16s_C3IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16s_C4IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_16s_AC4IRSfs(Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiLn_32f_C1R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiLn_32f_C3R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiLn_32f_C4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiLn_32f_AC4R(const Pvx32f* pSrc, int srcStep, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiLn_32f_C1IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiLn_32f_C3IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiLn_32f_C4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiLn_32f_AC4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
+/* ---- Complement ---- */
+/* Complement: converts between two's complement and sign-magnitude (its own inverse on every value but */
+/* INT_MIN): a negative x becomes INT_MIN - x (its magnitude with the sign bit set); INT_MIN becomes 0. */
+/* Checks the pointer (-8), sizes (-6), the step (-14). */
+PVX_API PvxStatus pvxiComplement_32s_C1IR(Pvx32s* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
 #ifdef __cplusplus
 }
 #endif
