@@ -72,6 +72,11 @@ inline VI MulLoI16(VI a, VI b) { return _mm_mullo_epi16(a, b); }
 inline VI MulLoI32(VI a, VI b) { return _mm_mullo_epi32(a, b); }
 inline VI EqU8(VI a, VI b) { return _mm_cmpeq_epi8(a, b); }
 inline VI EqI32(VI a, VI b) { return _mm_cmpeq_epi32(a, b); }
+inline VI SubI8(VI a, VI b) { return _mm_sub_epi8(a, b); }
+inline VI AvgU8(VI a, VI b) { return _mm_avg_epu8(a, b); }     // (a + b + 1) >> 1
+inline VI AvgU16(VI a, VI b) { return _mm_avg_epu16(a, b); }   // (a + b + 1) >> 1
+inline VI MinU16(VI a, VI b) { return _mm_min_epu16(a, b); }
+inline VI MulAddPairsI16(VI a, VI b) { return _mm_madd_epi16(a, b); }  // a0*b0 + a1*b1 in 32 bits
 inline VI MulHiI16(VI a, VI b) { return _mm_mulhi_epi16(a, b); }
 inline VI MulHiU16(VI a, VI b) { return _mm_mulhi_epu16(a, b); }
 inline VI MinI16(VI a, VI b) { return _mm_min_epi16(a, b); }
@@ -90,7 +95,6 @@ inline VI SrlI32(VI v, VI n) { return _mm_srl_epi32(v, n); }
 inline VI SraI32(VI v, VI n) { return _mm_sra_epi32(v, n); }
 inline VI EqI16(VI a, VI b) { return _mm_cmpeq_epi16(a, b); }
 inline VI AbsI16(VI a) { return _mm_abs_epi16(a); }
-inline VI MinU16(VI a, VI b) { return _mm_min_epu16(a, b); }
 inline VI MaxU16(VI a, VI b) { return _mm_max_epu16(a, b); }
 inline VI MinU8(VI a, VI b) { return _mm_min_epu8(a, b); }
 inline VI MaxU8(VI a, VI b) { return _mm_max_epu8(a, b); }

@@ -322,6 +322,117 @@ PVX_API PvxStatus pvxiDiv_Round_16s_C3IRSfs(const Pvx16s* pSrc, int srcStep, Pvx
 PVX_API PvxStatus pvxiDiv_Round_16s_C4IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int roundMode, int scaleFactor);
 PVX_API PvxStatus pvxiDiv_Round_16s_AC4IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int roundMode, int scaleFactor);
 
+/* ==== pointops/mul.api ==== */
+
+/* ---- Mul ---- */
+/* Mul: src1 * src2; complex: (ac - bd) + (ad + bc)i; in place: srcDst = src * srcDst. */
+/* Real types check pointers and sizes only: steps are used as given (a zero step re-reads one row). */
+/* Complex types check steps as well. Sfs: exact result times 2^-scaleFactor, rounded half to even, saturated. */
+PVX_API PvxStatus pvxiMul_8u_C1RSfs(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_8u_C3RSfs(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_8u_C4RSfs(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_8u_AC4RSfs(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16u_C1RSfs(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16u_C3RSfs(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16u_C4RSfs(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16u_AC4RSfs(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16s_C1RSfs(const Pvx16s* pSrc1, int src1Step, const Pvx16s* pSrc2, int src2Step, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16s_C3RSfs(const Pvx16s* pSrc1, int src1Step, const Pvx16s* pSrc2, int src2Step, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16s_C4RSfs(const Pvx16s* pSrc1, int src1Step, const Pvx16s* pSrc2, int src2Step, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16s_AC4RSfs(const Pvx16s* pSrc1, int src1Step, const Pvx16s* pSrc2, int src2Step, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_8u_C1IRSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_8u_C3IRSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_8u_C4IRSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_8u_AC4IRSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16u_C1IRSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16u_C3IRSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16u_C4IRSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16u_AC4IRSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16s_C1IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16s_C3IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16s_C4IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16s_AC4IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_32f_C1R(const Pvx32f* pSrc1, int src1Step, const Pvx32f* pSrc2, int src2Step, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32f_C3R(const Pvx32f* pSrc1, int src1Step, const Pvx32f* pSrc2, int src2Step, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32f_C4R(const Pvx32f* pSrc1, int src1Step, const Pvx32f* pSrc2, int src2Step, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32f_AC4R(const Pvx32f* pSrc1, int src1Step, const Pvx32f* pSrc2, int src2Step, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32f_C1IR(const Pvx32f* pSrc, int srcStep, Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32f_C3IR(const Pvx32f* pSrc, int srcStep, Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32f_C4IR(const Pvx32f* pSrc, int srcStep, Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32f_AC4IR(const Pvx32f* pSrc, int srcStep, Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_16sc_C1RSfs(const Pvx16sc* pSrc1, int src1Step, const Pvx16sc* pSrc2, int src2Step, Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16sc_C3RSfs(const Pvx16sc* pSrc1, int src1Step, const Pvx16sc* pSrc2, int src2Step, Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16sc_AC4RSfs(const Pvx16sc* pSrc1, int src1Step, const Pvx16sc* pSrc2, int src2Step, Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_32sc_C1RSfs(const Pvx32sc* pSrc1, int src1Step, const Pvx32sc* pSrc2, int src2Step, Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_32sc_C3RSfs(const Pvx32sc* pSrc1, int src1Step, const Pvx32sc* pSrc2, int src2Step, Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_32sc_AC4RSfs(const Pvx32sc* pSrc1, int src1Step, const Pvx32sc* pSrc2, int src2Step, Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16sc_C1IRSfs(const Pvx16sc* pSrc, int srcStep, Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16sc_C3IRSfs(const Pvx16sc* pSrc, int srcStep, Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_16sc_AC4IRSfs(const Pvx16sc* pSrc, int srcStep, Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_32sc_C1IRSfs(const Pvx32sc* pSrc, int srcStep, Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_32sc_C3IRSfs(const Pvx32sc* pSrc, int srcStep, Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_32sc_AC4IRSfs(const Pvx32sc* pSrc, int srcStep, Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMul_32fc_C1R(const Pvx32fc* pSrc1, int src1Step, const Pvx32fc* pSrc2, int src2Step, Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32fc_C3R(const Pvx32fc* pSrc1, int src1Step, const Pvx32fc* pSrc2, int src2Step, Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32fc_AC4R(const Pvx32fc* pSrc1, int src1Step, const Pvx32fc* pSrc2, int src2Step, Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32fc_C1IR(const Pvx32fc* pSrc, int srcStep, Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32fc_C3IR(const Pvx32fc* pSrc, int srcStep, Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMul_32fc_AC4IR(const Pvx32fc* pSrc, int srcStep, Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
+/* ---- MulC ---- */
+/* MulC: src * value; in place: srcDst = srcDst * value. */
+/* C3 and AC4 take 3 values, C4 takes 4; the value pointer is checked with the image pointers. */
+PVX_API PvxStatus pvxiMulC_8u_C1RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u value, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16u_C1RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u value, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16s_C1RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s value, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_8u_C3RSfs(const Pvx8u* pSrc, int srcStep, const Pvx8u value[3], Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_8u_C4RSfs(const Pvx8u* pSrc, int srcStep, const Pvx8u value[4], Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_8u_AC4RSfs(const Pvx8u* pSrc, int srcStep, const Pvx8u value[3], Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16u_C3RSfs(const Pvx16u* pSrc, int srcStep, const Pvx16u value[3], Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16u_C4RSfs(const Pvx16u* pSrc, int srcStep, const Pvx16u value[4], Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16u_AC4RSfs(const Pvx16u* pSrc, int srcStep, const Pvx16u value[3], Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16s_C3RSfs(const Pvx16s* pSrc, int srcStep, const Pvx16s value[3], Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16s_C4RSfs(const Pvx16s* pSrc, int srcStep, const Pvx16s value[4], Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16s_AC4RSfs(const Pvx16s* pSrc, int srcStep, const Pvx16s value[3], Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_8u_C1IRSfs(Pvx8u value, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16u_C1IRSfs(Pvx16u value, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16s_C1IRSfs(Pvx16s value, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_8u_C3IRSfs(const Pvx8u value[3], Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_8u_C4IRSfs(const Pvx8u value[4], Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_8u_AC4IRSfs(const Pvx8u value[3], Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16u_C3IRSfs(const Pvx16u value[3], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16u_C4IRSfs(const Pvx16u value[4], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16u_AC4IRSfs(const Pvx16u value[3], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16s_C3IRSfs(const Pvx16s value[3], Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16s_C4IRSfs(const Pvx16s value[4], Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16s_AC4IRSfs(const Pvx16s value[3], Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_32f_C1R(const Pvx32f* pSrc, int srcStep, Pvx32f value, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32f_C3R(const Pvx32f* pSrc, int srcStep, const Pvx32f value[3], Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32f_C4R(const Pvx32f* pSrc, int srcStep, const Pvx32f value[4], Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32f_AC4R(const Pvx32f* pSrc, int srcStep, const Pvx32f value[3], Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32f_C1IR(Pvx32f value, Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32f_C3IR(const Pvx32f value[3], Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32f_C4IR(const Pvx32f value[4], Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32f_AC4IR(const Pvx32f value[3], Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_16sc_C1RSfs(const Pvx16sc* pSrc, int srcStep, Pvx16sc value, Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_32sc_C1RSfs(const Pvx32sc* pSrc, int srcStep, Pvx32sc value, Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16sc_C3RSfs(const Pvx16sc* pSrc, int srcStep, const Pvx16sc value[3], Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16sc_AC4RSfs(const Pvx16sc* pSrc, int srcStep, const Pvx16sc value[3], Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_32sc_C3RSfs(const Pvx32sc* pSrc, int srcStep, const Pvx32sc value[3], Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_32sc_AC4RSfs(const Pvx32sc* pSrc, int srcStep, const Pvx32sc value[3], Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16sc_C1IRSfs(Pvx16sc value, Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_32sc_C1IRSfs(Pvx32sc value, Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16sc_C3IRSfs(const Pvx16sc value[3], Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_16sc_AC4IRSfs(const Pvx16sc value[3], Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_32sc_C3IRSfs(const Pvx32sc value[3], Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_32sc_AC4IRSfs(const Pvx32sc value[3], Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiMulC_32fc_C1R(const Pvx32fc* pSrc, int srcStep, Pvx32fc value, Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32fc_C3R(const Pvx32fc* pSrc, int srcStep, const Pvx32fc value[3], Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32fc_AC4R(const Pvx32fc* pSrc, int srcStep, const Pvx32fc value[3], Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32fc_C1IR(Pvx32fc value, Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32fc_C3IR(const Pvx32fc value[3], Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiMulC_32fc_AC4IR(const Pvx32fc value[3], Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
 /* ==== pointops/mulscale.api ==== */
 
 /* ---- MulScale ---- */
@@ -362,6 +473,117 @@ PVX_API PvxStatus pvxiMulCScale_8u_AC4IR(const Pvx8u value[3], Pvx8u* pSrcDst, i
 PVX_API PvxStatus pvxiMulCScale_16u_C3IR(const Pvx16u value[3], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
 PVX_API PvxStatus pvxiMulCScale_16u_C4IR(const Pvx16u value[4], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
 PVX_API PvxStatus pvxiMulCScale_16u_AC4IR(const Pvx16u value[3], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
+/* ==== pointops/sub.api ==== */
+
+/* ---- Sub ---- */
+/* Sub: src2 - src1 (second minus first, as callers rely on); in place: srcDst = srcDst - src. */
+/* Real types check pointers and sizes only: steps are used as given (a zero step re-reads one row). */
+/* Complex types check steps as well. Sfs: exact result times 2^-scaleFactor, rounded half to even, saturated. */
+PVX_API PvxStatus pvxiSub_8u_C1RSfs(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_8u_C3RSfs(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_8u_C4RSfs(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_8u_AC4RSfs(const Pvx8u* pSrc1, int src1Step, const Pvx8u* pSrc2, int src2Step, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16u_C1RSfs(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16u_C3RSfs(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16u_C4RSfs(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16u_AC4RSfs(const Pvx16u* pSrc1, int src1Step, const Pvx16u* pSrc2, int src2Step, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16s_C1RSfs(const Pvx16s* pSrc1, int src1Step, const Pvx16s* pSrc2, int src2Step, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16s_C3RSfs(const Pvx16s* pSrc1, int src1Step, const Pvx16s* pSrc2, int src2Step, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16s_C4RSfs(const Pvx16s* pSrc1, int src1Step, const Pvx16s* pSrc2, int src2Step, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16s_AC4RSfs(const Pvx16s* pSrc1, int src1Step, const Pvx16s* pSrc2, int src2Step, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_8u_C1IRSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_8u_C3IRSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_8u_C4IRSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_8u_AC4IRSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16u_C1IRSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16u_C3IRSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16u_C4IRSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16u_AC4IRSfs(const Pvx16u* pSrc, int srcStep, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16s_C1IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16s_C3IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16s_C4IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16s_AC4IRSfs(const Pvx16s* pSrc, int srcStep, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_32f_C1R(const Pvx32f* pSrc1, int src1Step, const Pvx32f* pSrc2, int src2Step, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32f_C3R(const Pvx32f* pSrc1, int src1Step, const Pvx32f* pSrc2, int src2Step, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32f_C4R(const Pvx32f* pSrc1, int src1Step, const Pvx32f* pSrc2, int src2Step, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32f_AC4R(const Pvx32f* pSrc1, int src1Step, const Pvx32f* pSrc2, int src2Step, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32f_C1IR(const Pvx32f* pSrc, int srcStep, Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32f_C3IR(const Pvx32f* pSrc, int srcStep, Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32f_C4IR(const Pvx32f* pSrc, int srcStep, Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32f_AC4IR(const Pvx32f* pSrc, int srcStep, Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_16sc_C1RSfs(const Pvx16sc* pSrc1, int src1Step, const Pvx16sc* pSrc2, int src2Step, Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16sc_C3RSfs(const Pvx16sc* pSrc1, int src1Step, const Pvx16sc* pSrc2, int src2Step, Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16sc_AC4RSfs(const Pvx16sc* pSrc1, int src1Step, const Pvx16sc* pSrc2, int src2Step, Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_32sc_C1RSfs(const Pvx32sc* pSrc1, int src1Step, const Pvx32sc* pSrc2, int src2Step, Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_32sc_C3RSfs(const Pvx32sc* pSrc1, int src1Step, const Pvx32sc* pSrc2, int src2Step, Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_32sc_AC4RSfs(const Pvx32sc* pSrc1, int src1Step, const Pvx32sc* pSrc2, int src2Step, Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16sc_C1IRSfs(const Pvx16sc* pSrc, int srcStep, Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16sc_C3IRSfs(const Pvx16sc* pSrc, int srcStep, Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_16sc_AC4IRSfs(const Pvx16sc* pSrc, int srcStep, Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_32sc_C1IRSfs(const Pvx32sc* pSrc, int srcStep, Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_32sc_C3IRSfs(const Pvx32sc* pSrc, int srcStep, Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_32sc_AC4IRSfs(const Pvx32sc* pSrc, int srcStep, Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSub_32fc_C1R(const Pvx32fc* pSrc1, int src1Step, const Pvx32fc* pSrc2, int src2Step, Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32fc_C3R(const Pvx32fc* pSrc1, int src1Step, const Pvx32fc* pSrc2, int src2Step, Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32fc_AC4R(const Pvx32fc* pSrc1, int src1Step, const Pvx32fc* pSrc2, int src2Step, Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32fc_C1IR(const Pvx32fc* pSrc, int srcStep, Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32fc_C3IR(const Pvx32fc* pSrc, int srcStep, Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSub_32fc_AC4IR(const Pvx32fc* pSrc, int srcStep, Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
+
+/* ---- SubC ---- */
+/* SubC: src - value; in place: srcDst = srcDst - value. */
+/* C3 and AC4 take 3 values, C4 takes 4; the value pointer is checked with the image pointers. */
+PVX_API PvxStatus pvxiSubC_8u_C1RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u value, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16u_C1RSfs(const Pvx16u* pSrc, int srcStep, Pvx16u value, Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16s_C1RSfs(const Pvx16s* pSrc, int srcStep, Pvx16s value, Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_8u_C3RSfs(const Pvx8u* pSrc, int srcStep, const Pvx8u value[3], Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_8u_C4RSfs(const Pvx8u* pSrc, int srcStep, const Pvx8u value[4], Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_8u_AC4RSfs(const Pvx8u* pSrc, int srcStep, const Pvx8u value[3], Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16u_C3RSfs(const Pvx16u* pSrc, int srcStep, const Pvx16u value[3], Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16u_C4RSfs(const Pvx16u* pSrc, int srcStep, const Pvx16u value[4], Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16u_AC4RSfs(const Pvx16u* pSrc, int srcStep, const Pvx16u value[3], Pvx16u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16s_C3RSfs(const Pvx16s* pSrc, int srcStep, const Pvx16s value[3], Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16s_C4RSfs(const Pvx16s* pSrc, int srcStep, const Pvx16s value[4], Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16s_AC4RSfs(const Pvx16s* pSrc, int srcStep, const Pvx16s value[3], Pvx16s* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_8u_C1IRSfs(Pvx8u value, Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16u_C1IRSfs(Pvx16u value, Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16s_C1IRSfs(Pvx16s value, Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_8u_C3IRSfs(const Pvx8u value[3], Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_8u_C4IRSfs(const Pvx8u value[4], Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_8u_AC4IRSfs(const Pvx8u value[3], Pvx8u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16u_C3IRSfs(const Pvx16u value[3], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16u_C4IRSfs(const Pvx16u value[4], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16u_AC4IRSfs(const Pvx16u value[3], Pvx16u* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16s_C3IRSfs(const Pvx16s value[3], Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16s_C4IRSfs(const Pvx16s value[4], Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16s_AC4IRSfs(const Pvx16s value[3], Pvx16s* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_32f_C1R(const Pvx32f* pSrc, int srcStep, Pvx32f value, Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32f_C3R(const Pvx32f* pSrc, int srcStep, const Pvx32f value[3], Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32f_C4R(const Pvx32f* pSrc, int srcStep, const Pvx32f value[4], Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32f_AC4R(const Pvx32f* pSrc, int srcStep, const Pvx32f value[3], Pvx32f* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32f_C1IR(Pvx32f value, Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32f_C3IR(const Pvx32f value[3], Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32f_C4IR(const Pvx32f value[4], Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32f_AC4IR(const Pvx32f value[3], Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_16sc_C1RSfs(const Pvx16sc* pSrc, int srcStep, Pvx16sc value, Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_32sc_C1RSfs(const Pvx32sc* pSrc, int srcStep, Pvx32sc value, Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16sc_C3RSfs(const Pvx16sc* pSrc, int srcStep, const Pvx16sc value[3], Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16sc_AC4RSfs(const Pvx16sc* pSrc, int srcStep, const Pvx16sc value[3], Pvx16sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_32sc_C3RSfs(const Pvx32sc* pSrc, int srcStep, const Pvx32sc value[3], Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_32sc_AC4RSfs(const Pvx32sc* pSrc, int srcStep, const Pvx32sc value[3], Pvx32sc* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16sc_C1IRSfs(Pvx16sc value, Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_32sc_C1IRSfs(Pvx32sc value, Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16sc_C3IRSfs(const Pvx16sc value[3], Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_16sc_AC4IRSfs(const Pvx16sc value[3], Pvx16sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_32sc_C3IRSfs(const Pvx32sc value[3], Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_32sc_AC4IRSfs(const Pvx32sc value[3], Pvx32sc* pSrcDst, int srcDstStep, PvxiSize roiSize, int scaleFactor);
+PVX_API PvxStatus pvxiSubC_32fc_C1R(const Pvx32fc* pSrc, int srcStep, Pvx32fc value, Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32fc_C3R(const Pvx32fc* pSrc, int srcStep, const Pvx32fc value[3], Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32fc_AC4R(const Pvx32fc* pSrc, int srcStep, const Pvx32fc value[3], Pvx32fc* pDst, int dstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32fc_C1IR(Pvx32fc value, Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32fc_C3IR(const Pvx32fc value[3], Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
+PVX_API PvxStatus pvxiSubC_32fc_AC4IR(const Pvx32fc value[3], Pvx32fc* pSrcDst, int srcDstStep, PvxiSize roiSize);
 
 /* ==== pointops/unary.api ==== */
 

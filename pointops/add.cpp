@@ -9,7 +9,10 @@ namespace {
 using namespace simd;
 
 // a + b. Unsigned 8u sums and their rounding stay within 16-bit lanes; at
-// scale factor 0 the saturating add is the whole rule.
+// scale factor 0 the saturating add is the whole rule. At scale factor 1 the
+// unsigned types take the rounding-up average and step back to the even
+// neighbour where the sum was odd and the average is odd: 5 operations a
+// register instead of 16, which keeps the 8u halving at memory speed.
 struct AddX : ExactBase {
     static constexpr bool kFits16 = true;
     static Wide Exact(Wide a, Wide b) { return a + b; }
@@ -23,6 +26,18 @@ struct AddX : ExactBase {
         if constexpr (std::is_same_v<U, Pvx8u>) return AddSatU8(a, b);
         else if constexpr (std::is_same_v<U, Pvx16u>) return AddSatU16(a, b);
         else return AddSatS16(a, b);
+    }
+    template <class U>
+        requires(!std::is_same_v<U, Pvx16s>)
+    static VI Half(VI a, VI b)
+    {
+        if constexpr (std::is_same_v<U, Pvx8u>) {
+            VI avg = AvgU8(a, b);
+            return SubI8(avg, And(And(Xor(a, b), avg), SplatU8(1)));
+        } else {
+            VI avg = AvgU16(a, b);
+            return SubI16(avg, And(And(Xor(a, b), avg), SplatU16(1)));
+        }
     }
 };
 

@@ -19,13 +19,26 @@
 // Scale factors above the point where every result rounds to 0 fill the
 // destination with 0 before any pixel is read.
 //
+// An op struct has: using Unit (the element a lane holds: the part type for
+// part-wise complex ops, the complex type for complex products); a
+// constructor from the scale factor; static constexpr bool kHasVector; bool
+// Vector() const (the call's scale factor may still refuse the vector path);
+// Unit Scalar(Unit, Unit) and VI Vec(VI, VI) (one argument each for unary
+// ops). IntOp, FloatOp and PartOp below build ops from an exact-operation
+// struct X; IntOp is exact for every scale factor.
+//
 // A family supplies a struct Fam with
 //   template <class T, Sf M> using Op;   two-image op, Scalar(src1, src2)
 //   template <class T, Sf M> using OpC;  constant op,  Scalar(src, value)
 //   template <class T> static constexpr Wide MaxAbs();  bound of |exact result|
 //   static constexpr int kIdentity;      constant (re part for complex) that
-//                                        makes the op a copy at sf 0
-// and names ArithBody / ArithIBody / ArithCBody / ArithCIBody in its table.
+//                                        makes the op a copy at sf 0 (constant
+//                                        forms of integer types only)
+// and names ArithBody / ArithIBody / ArithCBody / ArithCIBody (or, for unary
+// families whose Op has Scalar(a) and Vec(a), ArithUBody / ArithUIBody) in its
+// table. Families with their own checks or statuses call RunRows from their
+// own bodies; an op that must report something per call (a zero divisor)
+// can carry a pointer to a flag: ArithRow copies the op, not what it points to.
 #pragma once
 
 #include <cstddef>
@@ -43,7 +56,9 @@
 namespace pvx {
 
 // Scale-factor case of an integer op, chosen once per call; kNone for floats.
-enum class Sf { kNone, kZero, kDown, kUp };
+// kHalf is sf == 1 for ops that have a whole-register path for it (the
+// others never see it).
+enum class Sf { kNone, kZero, kDown, kUp, kHalf };
 
 // The second operand of the row loop.
 enum class Src2 { kImage, kConst, kNone };
@@ -123,6 +138,21 @@ inline simd::VI Scale16(simd::VI r, const SfsK& k)
     }
 }
 
+// Scales exact results held in unsigned 16-bit lanes (8u products, up to sf 8).
+template <Sf M>
+inline simd::VI Scale16U(simd::VI r, const SfsK& k)
+{
+    using namespace simd;
+    if constexpr (M == Sf::kDown) {
+        VI odd = And(SrlI16(r, k.cnt), k.one16);
+        return SrlI16(AddI16(AddI16(r, odd), k.half16), k.cnt);
+    } else if constexpr (M == Sf::kUp) {
+        return SllI16(MinU16(r, k.hi16), k.cnt);
+    } else {
+        return MinU16(r, _mm_set1_epi16(255));
+    }
+}
+
 // Scales exact results held in signed 32-bit lanes, or unsigned ones (kU32:
 // 16u products, which need all 32 bits).
 template <Sf M, bool kU32 = false>
@@ -188,6 +218,12 @@ inline void Widen32(simd::VI v, simd::VI* out)
 //   static float F(float a, float b), static VF V(VF a, VF b)   float forms
 //   kFits16: 8u results and their rounding fit signed 16-bit lanes
 //     (then static VI L16(VI a, VI b) on widened lanes)
+//   kFits16U: 8u results fit unsigned 16-bit lanes, with their rounding up
+//     to sf 8 (then static VI L16(VI a, VI b) on widened lanes; 32-bit lanes
+//     above sf 8)
+//   template <class U> static VI Half(VI a, VI b): the whole sf == 1 result
+//   template <class U> static VI Down(VI a, VI b, const SfsK&): the whole
+//     result for sf 1 to 15 (32-bit lanes above)
 //   static VI L32(VI a, VI b) on 32-bit lanes, or
 //   template <class U> static void Exact32(VI a, VI b, VI* r) on raw registers
 //   template <class U> static VI Sat(VI a, VI b): the whole sf == 0 result
@@ -195,11 +231,16 @@ inline void Widen32(simd::VI v, simd::VI* out)
 // Ops state kHasVector; Vector() may still refuse a call's scale factor.
 struct ExactBase {
     static constexpr bool kFits16 = false;
+    static constexpr bool kFits16U = false;
     template <class U> static constexpr bool kU32 = false;
 };
 
 template <class X, class U>
 concept HasSat = requires(simd::VI a) { X::template Sat<U>(a, a); };
+template <class X, class U>
+concept HasHalf = requires(simd::VI a) { X::template Half<U>(a, a); };
+template <class X, class U>
+concept HasDown = requires(simd::VI a, const SfsK& k) { X::template Down<U>(a, a, k); };
 template <class X, class U>
 concept HasExact32 = requires(simd::VI a, simd::VI* r) { X::template Exact32<U>(a, a, r); };
 
@@ -209,6 +250,7 @@ template <class X, class U, Sf M>
 struct IntOp {
     using Unit = U;
     static constexpr bool kHasVector = sizeof(U) <= 2;
+    static constexpr bool kHalfPath = HasHalf<X, U>;
     SfsK k;
     bool vec;
     explicit IntOp(int sf)
@@ -222,11 +264,30 @@ struct IntOp {
         using namespace simd;
         if constexpr (M == Sf::kZero && HasSat<X, U>) {
             return X::template Sat<U>(a, b);
+        } else if constexpr (M == Sf::kHalf) {
+            return X::template Half<U>(a, b);
+        } else if constexpr (M == Sf::kDown && HasDown<X, U>) {
+            return k.sf <= 15 ? X::template Down<U>(a, b, k) : Vec32(a, b);
+        } else if constexpr (sizeof(U) == 1 && X::kFits16U) {
+            if (M != Sf::kDown || k.sf <= 8) {
+                VI lo = Scale16U<M>(X::L16(WidenLoU8(a), WidenLoU8(b)), k);
+                VI hi = Scale16U<M>(X::L16(WidenHiU8(a), WidenHiU8(b)), k);
+                return PackUsS16(lo, hi);
+            }
+            return Vec32(a, b);
         } else if constexpr (sizeof(U) == 1 && X::kFits16) {
             VI lo = Scale16<M>(X::L16(WidenLoU8(a), WidenLoU8(b)), k);
             VI hi = Scale16<M>(X::L16(WidenHiU8(a), WidenHiU8(b)), k);
             return PackUsS16(lo, hi);
-        } else if constexpr (sizeof(U) <= 2) {
+        } else {
+            return Vec32(a, b);
+        }
+    }
+    // Exact results in 32-bit lanes, scaled and packed.
+    simd::VI Vec32(simd::VI a, simd::VI b) const
+    {
+        using namespace simd;
+        if constexpr (sizeof(U) <= 2) {
             constexpr int kN = 4 / sizeof(U);
             VI r[kN];
             if constexpr (HasExact32<X, U>) {
@@ -329,16 +390,24 @@ void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const t
     constexpr bool kAlpha = kKeepsAlpha<L>;
     std::ptrdiff_t i = 0;
     if constexpr (Op::kHasVector) {
-        std::ptrdiff_t nv = op.Vector() ? n : 0;
+        // Local copies: the stores below may alias anything reached through a
+        // reference, so constants held there would be reloaded every register.
+        const Op o = op;
+        VI cst[P::kRegs], alpha[P::kRegs];
+        for (int r = 0; r < P::kRegs; ++r) {
+            cst[r] = pat.cst[r];
+            alpha[r] = pat.alpha[r];
+        }
+        std::ptrdiff_t nv = o.Vector() ? n : 0;
         for (; i + P::kUnits <= nv; i += P::kUnits) {
             for (int r = 0; r < P::kRegs; ++r) {
                 std::ptrdiff_t j = i + r * P::kLanes;
                 VI va = Load<A>(a + j);
                 VI v;
-                if constexpr (K == Src2::kImage) v = op.Vec(va, Load<A>(b + j));
-                else if constexpr (K == Src2::kConst) v = op.Vec(va, pat.cst[r]);
-                else v = op.Vec(va);
-                if constexpr (kAlpha) v = SelectBytes(v, Load<A>(d + j), pat.alpha[r]);
+                if constexpr (K == Src2::kImage) v = o.Vec(va, Load<A>(b + j));
+                else if constexpr (K == Src2::kConst) v = o.Vec(va, cst[r]);
+                else v = o.Vec(va);
+                if constexpr (kAlpha) v = SelectBytes(v, Load<A>(d + j), alpha[r]);
                 Store<A>(d + j, v);
             }
         }
@@ -441,6 +510,20 @@ bool IsIdentity(const T* value)
     return true;
 }
 
+// The family's op for the second operand K: OpC for constants, else Op.
+template <class Fam, class T, Src2 K, Sf M>
+struct OpOfT {
+    using type = typename Fam::template Op<T, M>;
+};
+template <class Fam, class T, Sf M>
+struct OpOfT<Fam, T, Src2::kConst, M> {
+    using type = typename Fam::template OpC<T, M>;
+};
+template <class Fam, class T, Src2 K, Sf M>
+using OpOf = typename OpOfT<Fam, T, K, M>::type;
+template <class Op>
+concept HalfPathOp = requires { requires Op::kHalfPath; };
+
 // Runs the family's op over the region for the scale factor: zero fill above
 // the family's zero point, else the op for sf 0, down or up.
 template <class Fam, class T, Lay L, Src2 K>
@@ -448,13 +531,8 @@ PvxStatus ArithRun(const T* a, int aStep, const T* b, int bStep, T* d, int dStep
                    const T* value)
 {
     auto run = [&]<Sf M>() {
-        if constexpr (K == Src2::kConst) {
-            using Op = typename Fam::template OpC<T, M>;
-            RunRows<T, L, K>(Op(sf), a, aStep, b, bStep, d, dStep, roi, value);
-        } else {
-            using Op = typename Fam::template Op<T, M>;
-            RunRows<T, L, K>(Op(sf), a, aStep, b, bStep, d, dStep, roi, value);
-        }
+        using Op = OpOf<Fam, T, K, M>;
+        RunRows<T, L, K>(Op(sf), a, aStep, b, bStep, d, dStep, roi, value);
     };
     if constexpr (std::is_floating_point_v<Element<T>>) {
         run.template operator()<Sf::kNone>();
@@ -466,6 +544,12 @@ PvxStatus ArithRun(const T* a, int aStep, const T* b, int bStep, T* d, int dStep
                 if (IsIdentity<Fam, T, L>(value)) return CopyRows<T, L>(a, aStep, d, dStep, roi);
             run.template operator()<Sf::kZero>();
         } else if (sf > 0) {
+            if constexpr (HalfPathOp<OpOf<Fam, T, K, Sf::kDown>>) {
+                if (sf == 1) {
+                    run.template operator()<Sf::kHalf>();
+                    return pvxStsNoErr;
+                }
+            }
             run.template operator()<Sf::kDown>();
         } else {
             run.template operator()<Sf::kUp>();
@@ -556,6 +640,33 @@ template <class Fam, class T, Lay L, Order O>
 PvxStatus ArithCIBody(T value, T* pSrcDst, int srcDstStep, PvxiSize roi)
 {
     return ArithCIBody<Fam, T, L, O>(value, pSrcDst, srcDstStep, roi, 0);
+}
+
+// One image (unary families: Fam::Op has Scalar(a) and Vec(a)): d = op(src).
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({pSrc, pDst}, roi, {srcStep, dstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kNone>(pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi, scaleFactor, nullptr);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
+{
+    return ArithUBody<Fam, T, L, O>(pSrc, srcStep, pDst, dstStep, roi, 0);
+}
+
+// One image in place: srcDst = op(srcDst).
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUIBody(T* pSrcDst, int srcDstStep, PvxiSize roi, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<O>({pSrcDst}, roi, {srcDstStep})) return s;
+    return ArithRun<Fam, T, L, Src2::kNone>(pSrcDst, srcDstStep, pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi,
+                                           scaleFactor, nullptr);
+}
+template <class Fam, class T, Lay L, Order O>
+PvxStatus ArithUIBody(T* pSrcDst, int srcDstStep, PvxiSize roi)
+{
+    return ArithUIBody<Fam, T, L, O>(pSrcDst, srcDstStep, roi, 0);
 }
 
 // The bound of |exact result| of the common operations on elements E.

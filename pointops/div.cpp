@@ -96,7 +96,7 @@ struct IntDivOp {
     VF scaleF;
     VD scaleD;
     AlphaLanes<U, L> alpha;
-    mutable bool zero = false;
+    bool* zero = nullptr;  // set when a zero divisor is met (the row loop copies the op)
 
     explicit IntDivOp(int scaleFactor) : sf(scaleFactor)
     {
@@ -133,7 +133,7 @@ struct IntDivOp {
             return Quot(a, b);
         } else {
             VI den = alpha.Fill(a);
-            if (MaskBytes(Eq0(den))) zero = true;
+            if (MaskBytes(Eq0(den))) *zero = true;
             return Quot(b, den);
         }
     }
@@ -142,7 +142,7 @@ struct IntDivOp {
         if constexpr (kConst) {
             return QuotSat<U>(a, b, sf, R);
         } else {
-            if (a == 0) zero = true;
+            if (a == 0) *zero = true;
             return QuotSat<U>(b, a, sf, R);
         }
     }
@@ -187,7 +187,7 @@ template <Lay L>
 struct Div32fOp {
     using Unit = Pvx32f;
     AlphaLanes<Pvx32f, L> alpha;
-    mutable bool zero = false;
+    bool* zero = nullptr;  // set when a zero divisor is met (the row loop copies the op)
 
     static constexpr bool kHasVector = true;
     bool Vector() const { return true; }
@@ -197,14 +197,14 @@ struct Div32fOp {
         VF n = AsFloat(b);
         VF z = EqF(d, ZeroF());
         if (!MaskF(z)) return AsInt(RefinedQuot(n, d));
-        zero = true;
+        *zero = true;
         return AsInt(SelectF(DivF(n, d), OverZero(n), z));
     }
     // A tail element: a group of one.
     Pvx32f Scalar(Pvx32f d, Pvx32f n) const
     {
         if (d == 0) {
-            zero = true;
+            *zero = true;
             return OverZero(n);
         }
         return _mm_cvtss_f32(RefinedQuot(_mm_set_ss(n), _mm_set_ss(d)));
@@ -214,7 +214,6 @@ struct Div32fOp {
 // DivC_32f: correctly rounded quotient by the constant.
 struct DivC32fOp {
     using Unit = Pvx32f;
-    mutable bool zero = false;
     static constexpr bool kHasVector = true;
     bool Vector() const { return true; }
     VI Vec(VI a, VI c) const { return AsInt(DivF(AsFloat(a), AsFloat(c))); }
@@ -230,7 +229,7 @@ struct CplxDivOp {
     using Unit = T;
     using E = Element<T>;
     int sf;
-    mutable bool zero = false;
+    bool* zero = nullptr;  // set when a zero divisor is met (the row loop copies the op)
 
     explicit CplxDivOp(int scaleFactor) : sf(scaleFactor) {}
     static constexpr bool kHasVector = false;
@@ -244,7 +243,7 @@ struct CplxDivOp {
         T r;
         if constexpr (std::is_floating_point_v<E>) {
             if (den.re == 0 && den.im == 0) {
-                zero = true;
+                *zero = true;
                 r.re = OverZero(num.re);
                 r.im = OverZero(num.im);
                 return r;
@@ -255,7 +254,7 @@ struct CplxDivOp {
         } else {
             Wide c = den.re, d = den.im, x = num.re, y = num.im;
             Wide m = c * c + d * d;
-            if (m == 0) zero = true;
+            if (m == 0) *zero = true;
             r.re = m == 0 ? QuotSat<E>(x, 0, sf, Rnd::kEven) : QuotSat<E>(x * c + y * d, m, sf, Rnd::kEven);
             r.im = m == 0 ? QuotSat<E>(y, 0, sf, Rnd::kEven) : QuotSat<E>(y * c - x * d, m, sf, Rnd::kEven);
         }
@@ -292,7 +291,8 @@ PvxStatus DivRun(const T* a, int aStep, const T* b, int bStep, T* d, int dStep, 
             // rows of width * channels elements, so one register is one group
             // and only the last (width * channels) mod 4 elements are singles.
             constexpr Lay kRowLay = kKeepsAlpha<L> ? L : Lay::C1;
-            const Div32fOp<kRowLay> op;
+            Div32fOp<kRowLay> op;
+            op.zero = &zero;
             PvxiSize rows{roi.width * (kKeepsAlpha<L> ? 1 : kChannels<L>), roi.height};
             if (rows.width % 4 == 0 || kKeepsAlpha<L>) {
                 RunRows<T, kRowLay, K>(op, a, aStep, b, bStep, d, dStep, rows);
@@ -303,21 +303,20 @@ PvxStatus DivRun(const T* a, int aStep, const T* b, int bStep, T* d, int dStep, 
                     RunRows<T, kRowLay, K>(op, RowAt(a, aStep, y), aStep, RowAt(b, bStep, y), bStep,
                                            RowAt(d, dStep, y), dStep, PvxiSize{rows.width, 1});
             }
-            zero = op.zero;
         }
     } else if constexpr (kIsComplex<T>) {
         CplxDivOp<T, kC> op(sf);
+        op.zero = &zero;
         RunRows<T, L, K>(op, a, aStep, b, bStep, d, dStep, roi, value);
-        zero = op.zero;
     } else {
         auto run = [&]<Rnd R>() {
             IntDivOp<T, L, R, kC> op(sf);
+            op.zero = &zero;
             RunRows<T, L, K>(op, a, aStep, b, bStep, d, dStep, roi, value);
-            return op.zero;
         };
-        if (r == Rnd::kZero) zero = run.template operator()<Rnd::kZero>();
-        else if (r == Rnd::kAway) zero = run.template operator()<Rnd::kAway>();
-        else zero = run.template operator()<Rnd::kEven>();
+        if (r == Rnd::kZero) run.template operator()<Rnd::kZero>();
+        else if (r == Rnd::kAway) run.template operator()<Rnd::kAway>();
+        else run.template operator()<Rnd::kEven>();
     }
     return zero ? pvxStsDivByZero : pvxStsNoErr;
 }

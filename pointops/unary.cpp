@@ -74,7 +74,7 @@ template <class Self, class U>
 struct UnaryBase {
     using Unit = U;
     static constexpr bool kHasVector = true;
-    mutable bool flag = false;  // a logarithm of 0 was met
+    bool* flag = nullptr;  // set when a logarithm of 0 is met (the row loop copies the op)
     bool Vector() const { return true; }
     U Scalar(U x) const { return Lane0<U>(static_cast<const Self*>(this)->Vec(Broadcast(x))); }
 };
@@ -225,7 +225,7 @@ struct ExpOp : UnaryBase<ExpOp<T, L>, T> {
     {
         if constexpr (std::is_same_v<T, Pvx8u>) {
             VI idx = MinU8(MaxU8(a, SplatU8(static_cast<std::uint8_t>(lo))), SplatU8(static_cast<std::uint8_t>(hi)));
-            return ShuffleBytes(tabLo, _mm_sub_epi8(idx, SplatU8(static_cast<std::uint8_t>(lo))));
+            return ShuffleBytes(tabLo, SubI8(idx, SplatU8(static_cast<std::uint8_t>(lo))));
         } else if constexpr (std::is_same_v<T, Pvx32f>) {
             return a;  // never called
         } else {
@@ -266,7 +266,7 @@ struct LnOp {
     static constexpr bool kHasVector = false;
     int sf;
     T table[std::is_same_v<T, Pvx8u> ? 256 : 1];
-    mutable bool flag = false;
+    bool* flag = nullptr;
     explicit LnOp(int scaleFactor) : sf(scaleFactor)
     {
         if constexpr (std::is_same_v<T, Pvx8u>)
@@ -276,7 +276,7 @@ struct LnOp {
     VI Vec(VI a) const { return a; }  // never called
     T Scalar(T x) const
     {
-        if (x == 0) flag = true;
+        if (x == 0) *flag = true;
         if constexpr (std::is_same_v<T, Pvx32f>) return std::log(x);
         else if constexpr (std::is_same_v<T, Pvx8u>) return table[x];
         else return LnRound<T>(x, sf);
@@ -289,7 +289,7 @@ template <class T, Lay L>
 struct ComplementOp {
     using Unit = Pvx32s;
     static constexpr bool kHasVector = true;
-    mutable bool flag = false;
+    bool* flag = nullptr;
     explicit ComplementOp(int) {}
     bool Vector() const { return true; }
     VI Vec(VI a) const
@@ -310,18 +310,22 @@ template <template <class, Lay> class Op, class T, Lay L, Order O>
 PvxStatus UnaryBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi, int scaleFactor = 0)
 {
     if (PvxStatus s = CheckFrame<O>({pSrc, pDst}, roi, {srcStep, dstStep})) return s;
-    const Op<T, L> op(scaleFactor);
+    bool met = false;
+    Op<T, L> op(scaleFactor);
+    op.flag = &met;
     RunRows<T, L, Src2::kNone>(op, pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi);
-    return op.flag ? pvxStsDivByZero : pvxStsNoErr;
+    return met ? pvxStsDivByZero : pvxStsNoErr;
 }
 
 template <template <class, Lay> class Op, class T, Lay L, Order O>
 PvxStatus UnaryIBody(T* pSrcDst, int srcDstStep, PvxiSize roi, int scaleFactor = 0)
 {
     if (PvxStatus s = CheckFrame<O>({pSrcDst}, roi, {srcDstStep})) return s;
-    const Op<T, L> op(scaleFactor);
+    bool met = false;
+    Op<T, L> op(scaleFactor);
+    op.flag = &met;
     RunRows<T, L, Src2::kNone>(op, pSrcDst, srcDstStep, pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi);
-    return op.flag ? pvxStsDivByZero : pvxStsNoErr;
+    return met ? pvxStsDivByZero : pvxStsNoErr;
 }
 
 }  // namespace

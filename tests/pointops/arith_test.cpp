@@ -78,8 +78,19 @@ std::vector<Shape> ShapesFor(int sf, Rng& rng)
 // One type and layout of one operation: the two-image, in-place, constant and
 // constant in-place members. Sub is second minus first: its two-image forms
 // take x from the second image.
-template <class T, int C, int K, class F2, class FI, class FC, class FCI>
-void RunMembers(const char* name, Bin op, F2 two, FI inPlace, FC cst, FCI cstInPlace)
+template <class T>
+using TwoFn = PvxStatus (*)(const T*, int, const T*, int, T*, int, PvxiSize, int);
+template <class T>
+using InPlaceFn = PvxStatus (*)(const T*, int, T*, int, PvxiSize, int);
+template <class T>
+using ConstFn = PvxStatus (*)(const T*, int, const T*, T*, int, PvxiSize, int);
+template <class T>
+using ConstInPlaceFn = PvxStatus (*)(const T*, T*, int, PvxiSize, int);
+
+// C elements per pixel in memory, the first K of them processed.
+template <class T>
+void RunMembers(const char* name, Bin op, int C, int K, TwoFn<T> two, InPlaceFn<T> inPlace, ConstFn<T> cst,
+                ConstInPlaceFn<T> cstInPlace)
 {
     const bool swap = op == Bin::kSub;
     std::uint64_t seed = 0;
@@ -185,7 +196,7 @@ void RunMembers(const char* name, Bin op, F2 two, FI inPlace, FC cst, FCI cstInP
         EXPECT_TRUE(RegionEquals(d, Parts(want))) << "zero source steps";
         d.Snapshot();
         old = d.Packed<T>();
-        auto val = [&](std::size_t i) { return value[1 + i % C - (i % C)]; };
+        auto val = [&](std::size_t) { return value[1]; };
         T v1[4] = {value[1], value[1], value[1], value[1]};
         ASSERT_EQ(cst(pa, 0, v1, pd, sd, ok, sf), pvxStsNoErr);
         want = Expect(op, C, K, sf, old, at(r0a), val);
@@ -198,17 +209,17 @@ void RunMembers(const char* name, Bin op, F2 two, FI inPlace, FC cst, FCI cstInP
 #define ONE_VALUE *v
 #define VALUES v
 #define MEMBERS(OP, t, L, SFX, SFA, C, K, VAL)                                                                    \
-    RunMembers<Pvx##t, C, K>(                                                                                    \
-        "pvxi" #OP "_" #t "_" #L, Bin::k##OP,                                                                    \
-        [](const Pvx##t* a, int as, const Pvx##t* b, int bs, Pvx##t* d, int ds, PvxiSize r,                      \
+    RunMembers<Pvx##t>(                                                                                          \
+        "pvxi" #OP "_" #t "_" #L, Bin::k##OP, C, K,                                                              \
+        +[](const Pvx##t* a, int as, const Pvx##t* b, int bs, Pvx##t* d, int ds, PvxiSize r,                      \
            [[maybe_unused]] int sf) { return pvxi##OP##_##t##_##L##R##SFX(a, as, b, bs, d, ds, r SFA(sf)); },       \
-        [](const Pvx##t* a, int as, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {                    \
+        +[](const Pvx##t* a, int as, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {                    \
             return pvxi##OP##_##t##_##L##IR##SFX(a, as, d, ds, r SFA(sf));                                           \
         },                                                                                                       \
-        [](const Pvx##t* a, int as, const Pvx##t* v, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {   \
+        +[](const Pvx##t* a, int as, const Pvx##t* v, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {   \
             return pvxi##OP##C_##t##_##L##R##SFX(a, as, VAL, d, ds, r SFA(sf));                                      \
         },                                                                                                       \
-        [](const Pvx##t* v, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {                            \
+        +[](const Pvx##t* v, Pvx##t* d, int ds, PvxiSize r, [[maybe_unused]] int sf) {                            \
             return pvxi##OP##C_##t##_##L##IR##SFX(VAL, d, ds, r SFA(sf));                                            \
         })
 
@@ -232,6 +243,8 @@ void RunMembers(const char* name, Bin op, F2 two, FI inPlace, FC cst, FCI cstInP
     TEST(OP, Members32fc) { COMPLEX_MEMBERS(OP, 32fc, , NO_SF); }
 
 FAMILY_TESTS(Add)
+FAMILY_TESTS(Sub)
+FAMILY_TESTS(Mul)
 
 // ---- documented cases ----------------------------------------------------------
 
@@ -281,6 +294,104 @@ TEST(Add, ContiguousRowsGiveTheSameResult)
                                      {37, 1}, 2),
                   pvxStsNoErr);
     EXPECT_EQ(d1, d2);
+}
+
+// Whole-region calls on contiguous rows (one merged row) equal row-by-row calls,
+// so constants keep their channel pattern and AC4 alpha across rows.
+template <class T, int C, class F>
+void ExpectMergedEqualsRows(F call)
+{
+    const int w = 37, h = 4, n = w * C;
+    Rng rng = MakeRng(11);
+    std::vector<T> a(n * h), b(n * h), d1(n * h), d2(n * h);
+    FillRandom(reinterpret_cast<ElemT<T>*>(a.data()), a.size() * Elem<T>::kParts, rng);
+    FillRandom(reinterpret_cast<ElemT<T>*>(b.data()), b.size() * Elem<T>::kParts, rng);
+    FillRandom(reinterpret_cast<ElemT<T>*>(d1.data()), d1.size() * Elem<T>::kParts, rng);
+    d2 = d1;
+    int step = n * static_cast<int>(sizeof(T));
+    ASSERT_EQ(call(a.data(), b.data(), d1.data(), step, PvxiSize{w, h}), pvxStsNoErr);
+    for (int y = 0; y < h; ++y)
+        ASSERT_EQ(call(a.data() + n * y, b.data() + n * y, d2.data() + n * y, step, PvxiSize{w, 1}), pvxStsNoErr);
+    EXPECT_EQ(std::memcmp(d1.data(), d2.data(), d1.size() * sizeof(T)), 0);
+}
+
+TEST(Arith, ContiguousRowsKeepPatternsAndAlpha)
+{
+    ExpectMergedEqualsRows<Pvx8u, 3>([](const Pvx8u* a, const Pvx8u*, Pvx8u* d, int st, PvxiSize r) {
+        const Pvx8u v[3] = {1, 200, 37};
+        return pvxiAddC_8u_C3RSfs(a, st, v, d, st, r, 1);
+    });
+    ExpectMergedEqualsRows<Pvx8u, 4>([](const Pvx8u* a, const Pvx8u* b, Pvx8u* d, int st, PvxiSize r) {
+        return pvxiMul_8u_AC4RSfs(a, st, b, st, d, st, r, 3);
+    });
+    ExpectMergedEqualsRows<Pvx32fc, 4>([](const Pvx32fc* a, const Pvx32fc*, Pvx32fc* d, int st, PvxiSize r) {
+        const Pvx32fc v[3] = {{1, 2}, {-3, 0.5f}, {7, 7}};
+        return pvxiSubC_32fc_AC4R(a, st, v, d, st, r);
+    });
+    ExpectMergedEqualsRows<Pvx16sc, 3>([](const Pvx16sc* a, const Pvx16sc*, Pvx16sc* d, int st, PvxiSize r) {
+        const Pvx16sc v[3] = {{1, 2}, {-3, 5}, {7, 7}};
+        return pvxiMulC_16sc_C3RSfs(a, st, v, d, st, r, 2);
+    });
+    ExpectMergedEqualsRows<Pvx16u, 3>([](const Pvx16u* a, const Pvx16u*, Pvx16u* d, int st, PvxiSize r) {
+        const Pvx16u v[3] = {0, 0, 0};
+        return pvxiSubC_16u_C3RSfs(a, st, v, d, st, r, 0);
+    });
+}
+
+TEST(Arith, NegativeStepsWalkUpwards)
+{
+    const int w = 21, h = 3;
+    Rng rng = MakeRng(12);
+    std::vector<Pvx8u> a(w * h), b(w * h), d(w * h), want(w * h);
+    FillRandom(a.data(), a.size(), rng);
+    FillRandom(b.data(), b.size(), rng);
+    ASSERT_EQ(pvxiSub_8u_C1RSfs(a.data() + w * (h - 1), -w, b.data() + w * (h - 1), -w, d.data() + w * (h - 1), -w,
+                                {w, h}, 0),
+              pvxStsNoErr);
+    for (int i = 0; i < w * h; ++i) want[i] = b[i] > a[i] ? b[i] - a[i] : 0;
+    EXPECT_EQ(d, want);
+}
+
+TEST(Sub, SecondMinusFirst)
+{
+    Pvx8u a = 10, b = 3, d = 99;
+    ASSERT_EQ(pvxiSub_8u_C1RSfs(&a, 1, &b, 1, &d, 1, {1, 1}, 0), pvxStsNoErr);
+    EXPECT_EQ(d, 0);
+    ASSERT_EQ(pvxiSub_8u_C1RSfs(&b, 1, &a, 1, &d, 1, {1, 1}, 0), pvxStsNoErr);
+    EXPECT_EQ(d, 7);
+    Pvx8u sd = 10;
+    ASSERT_EQ(pvxiSub_8u_C1IRSfs(&b, 1, &sd, 1, {1, 1}, 0), pvxStsNoErr);
+    EXPECT_EQ(sd, 7);
+    ASSERT_EQ(pvxiSubC_8u_C1RSfs(&a, 1, 3, &d, 1, {1, 1}, 0), pvxStsNoErr);
+    EXPECT_EQ(d, 7);
+    Pvx32f fa = 1.5f, fb = 4.0f, fd = 0;
+    ASSERT_EQ(pvxiSub_32f_C1R(&fa, 4, &fb, 4, &fd, 4, {1, 1}), pvxStsNoErr);
+    EXPECT_EQ(fd, 2.5f);
+}
+
+TEST(Mul, ComplexProduct)
+{
+    Pvx16sc a{3, 4}, b{5, -2}, d{};
+    ASSERT_EQ(pvxiMul_16sc_C1RSfs(&a, 4, &b, 4, &d, 4, {1, 1}, 0), pvxStsNoErr);
+    EXPECT_EQ(d.re, 23);  // 15 + 8
+    EXPECT_EQ(d.im, 14);  // -6 + 20
+    Pvx32sc big{INT_MIN, INT_MIN}, e{};
+    ASSERT_EQ(pvxiMul_32sc_C1RSfs(&big, 8, &big, 8, &e, 8, {1, 1}, 62), pvxStsNoErr);
+    EXPECT_EQ(e.re, 0);  // 2^62 - 2^62
+    EXPECT_EQ(e.im, 2);  // 2^63 / 2^62
+    Pvx32fc fa{1.5f, -2.0f}, fb{4.0f, 0.25f}, fd{};
+    ASSERT_EQ(pvxiMulC_32fc_C1R(&fa, 8, fb, &fd, 8, {1, 1}), pvxStsNoErr);
+    EXPECT_EQ(fd.re, 6.5f);
+    EXPECT_EQ(fd.im, -7.625f);
+}
+
+TEST(Mul, ZeroFromScaleFactor17For8u)
+{
+    Pvx8u a = 255, d = 9;
+    ASSERT_EQ(pvxiMul_8u_C1RSfs(&a, 1, &a, 1, &d, 1, {1, 1}, 16), pvxStsNoErr);
+    EXPECT_EQ(d, 1);  // 65025 / 65536
+    ASSERT_EQ(pvxiMul_8u_C1RSfs(&a, 1, &a, 1, &d, 1, {1, 1}, 17), pvxStsNoErr);
+    EXPECT_EQ(d, 0);
 }
 
 }  // namespace
