@@ -115,6 +115,16 @@ inline VI SraI16(VI v, VI n) { return _mm_sra_epi16(v, n); }
 inline VI SllI32(VI v, VI n) { return _mm_sll_epi32(v, n); }
 inline VI SrlI32(VI v, VI n) { return _mm_srl_epi32(v, n); }
 inline VI SraI32(VI v, VI n) { return _mm_sra_epi32(v, n); }
+inline VI EqI16(VI a, VI b) { return _mm_cmpeq_epi16(a, b); }
+inline VI AbsI16(VI a) { return _mm_abs_epi16(a); }
+inline VI MaxU16(VI a, VI b) { return _mm_max_epu16(a, b); }
+inline VI MinU8(VI a, VI b) { return _mm_min_epu8(a, b); }
+inline VI MaxU8(VI a, VI b) { return _mm_max_epu8(a, b); }
+inline VI SrlI16n(VI v, int n) { return _mm_srli_epi16(v, n); }
+inline VI SrlI32n(VI v, int n) { return _mm_srli_epi32(v, n); }
+inline VI SllI16n(VI v, int n) { return _mm_slli_epi16(v, n); }
+inline VI SraI32n(VI v, int n) { return _mm_srai_epi32(v, n); }
+inline int MaskBytes(VI a) { return _mm_movemask_epi8(a); }
 
 // ---- widening and narrowing ----
 inline VI WidenLoU8(VI v) { return _mm_cvtepu8_epi16(v); }
@@ -148,5 +158,40 @@ inline VF DupEvenF(VF a) { return _mm_moveldup_ps(a); }  // re, re
 inline VF DupOddF(VF a) { return _mm_movehdup_ps(a); }   // im, im
 inline VF SwapPairsF(VF a) { return _mm_shuffle_ps(a, a, _MM_SHUFFLE(2, 3, 0, 1)); }
 inline VF SubAddF(VF a, VF b) { return _mm_addsub_ps(a, b); }  // a - b in even lanes, a + b in odd
+inline VF SqrtF(VF a) { return _mm_sqrt_ps(a); }
+inline VF AndF(VF a, VF b) { return _mm_and_ps(a, b); }
+inline VF OrF(VF a, VF b) { return _mm_or_ps(a, b); }
+inline VF AndNotF(VF notThis, VF b) { return _mm_andnot_ps(notThis, b); }
+inline VF EqF(VF a, VF b) { return _mm_cmpeq_ps(a, b); }
+inline VF GtF(VF a, VF b) { return _mm_cmpgt_ps(a, b); }
+inline VF LtF(VF a, VF b) { return _mm_cmplt_ps(a, b); }
+inline VF GeF(VF a, VF b) { return _mm_cmpge_ps(a, b); }
+inline VF OrderedF(VF a) { return _mm_cmpord_ps(a, a); }  // all ones where not NaN
+inline VF SelectF(VF a, VF b, VF mask) { return _mm_blendv_ps(a, b, mask); }  // b where mask
+inline int MaskF(VF a) { return _mm_movemask_ps(a); }
+// Rounding that ignores the thread's rounding control.
+inline VF RoundEvenF(VF a) { return _mm_round_ps(a, _MM_FROUND_TO_NEAREST_INT | _MM_FROUND_NO_EXC); }
+
+// ---- double ----
+inline VD SplatD(double v) { return _mm_set1_pd(v); }
+inline VD AddD(VD a, VD b) { return _mm_add_pd(a, b); }
+inline VD SubD(VD a, VD b) { return _mm_sub_pd(a, b); }
+inline VD MulD(VD a, VD b) { return _mm_mul_pd(a, b); }
+inline VD DivD(VD a, VD b) { return _mm_div_pd(a, b); }
+inline VD MinD(VD a, VD b) { return _mm_min_pd(a, b); }
+inline VD MaxD(VD a, VD b) { return _mm_max_pd(a, b); }
+inline VD SqrtD(VD a) { return _mm_sqrt_pd(a); }
+inline VD AndD(VD a, VD b) { return _mm_and_pd(a, b); }
+inline VD AndNotD(VD notThis, VD b) { return _mm_andnot_pd(notThis, b); }
+inline VD OrD(VD a, VD b) { return _mm_or_pd(a, b); }
+inline VD GeD(VD a, VD b) { return _mm_cmpge_pd(a, b); }
+inline VD OrderedD(VD a) { return _mm_cmpord_pd(a, a); }
+inline VD TruncD(VD a) { return _mm_round_pd(a, _MM_FROUND_TO_ZERO | _MM_FROUND_NO_EXC); }
+inline VD RoundEvenD(VD a) { return _mm_round_pd(a, _MM_FROUND_TO_NEAREST_INT | _MM_FROUND_NO_EXC); }
+// 32-bit lanes 0-1 (Lo) or 2-3 (Hi) to doubles; two doubles to 32-bit lanes
+// 0-1 (rounded by the rounding control: give it integral values).
+inline VD CvtLoI32D(VI a) { return _mm_cvtepi32_pd(a); }
+inline VD CvtHiI32D(VI a) { return _mm_cvtepi32_pd(_mm_unpackhi_epi64(a, a)); }
+inline VI CvtD32Pair(VD lo, VD hi) { return _mm_unpacklo_epi64(_mm_cvtpd_epi32(lo), _mm_cvtpd_epi32(hi)); }
 
 }  // namespace pvx::simd

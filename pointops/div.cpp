@@ -1,0 +1,402 @@
+// Div, DivC, Div_Round: quotients of two images or of an image and a constant.
+//
+// Operand order: the first image divides the second (pSrc2 / pSrc1), as Sub
+// subtracts the first from the second; in place, pSrcDst / pSrc. Callers
+// depend on this order.
+//
+// Integer members (8u, 16u, 16s): the exact quotient times 2^-scaleFactor,
+// rounded (half to even; Div_Round by its mode) and saturated. A zero divisor
+// pixel counts as an infinite quotient of the dividend's sign: the type's
+// maximum for a positive dividend, its minimum (0 for unsigned types) for a
+// negative one, and 0 for 0 / 0; the call still computes every row and returns
+// pvxStsDivByZero (6), as Div_32f does.
+//
+// Why the vector path may divide in floating point: the quotient v = N / d
+// with N = n * 2^-sf (exact: a power-of-two scale) is a rational whose
+// distance to any rounding boundary (an integer or a half-integer) that it
+// does not equal is at least 1 / (2 d 2^max(sf,0)), i.e. at least v / (2 |N|)
+// relative to v; boundaries that it equals are representable and the
+// correctly rounded division returns them exactly. So a division correctly
+// rounded to p bits decides every rounding like the exact value as long as
+// 2^-p < 1 / (2 |N|) wherever v can be below the saturation point. For 8u
+// (|N| < 2^16 there) single precision suffices at every scale factor; for
+// 16-bit elements single precision suffices for sf >= -7 (|N| < 2^23) and
+// double precision (|N| < 2^48) serves the rest. Scale factors are capped
+// where further scaling changes no result.
+//
+// Div_32f: groups of four elements counted from the start of each row. A
+// group without a zero divisor gets the refined reciprocal: r = rcp(d),
+// q = n r, e = 1 - d r, result q + (e q + q) e (this operation order is the
+// contract; the last bits may differ from a correctly rounded quotient). A
+// group with a zero divisor is computed element by element: the exact
+// quotient for non-zero divisors; +inf, -inf or the quiet NaN 0x7FC00000 for
+// a positive, negative, or zero/NaN dividend over zero. The last (width *
+// channels) mod 4 elements of a row are groups of one. Rows are merged into
+// one only when every row holds whole groups, so results never depend on the
+// steps or on alignment. AC4: a group is one pixel; the alpha divisor is not
+// looked at.
+//
+// DivC_32f divides exactly (correctly rounded); complex members use
+// (a+bi)/(c+di) = ((ac+bd) + (bc-ad)i)/(c^2+d^2): 32fc in single precision in
+// that order, 16sc and 32sc exactly in wide integers with the Sfs rule per
+// part. A zero complex divisor treats each part of the dividend as over zero.
+//
+// Checks: pointers (-8), sizes (-6), steps (-14); then DivC's constant (any
+// zero channel: pvxStsDivByZeroErr, -10) and Div_Round's mode (-213).
+#include <cstring>
+#include <limits>
+#include <type_traits>
+
+#include "arith.h"
+#include "arith_round.h"
+#include "check.h"
+#include "entry.h"
+#include "layout.h"
+#include "simd.h"
+
+namespace pvx {
+namespace {
+
+using namespace simd;
+
+// Lanes of the fourth channel in a register of units U (AC4), and 1 in them.
+template <class U, Lay L>
+struct AlphaLanes {
+    VI mask = Zero(), one = Zero();
+    AlphaLanes()
+    {
+        if constexpr (kKeepsAlpha<L>) {
+            alignas(16) U m[16 / sizeof(U)], o[16 / sizeof(U)];
+            for (int i = 0; i < static_cast<int>(16 / sizeof(U)); ++i) {
+                bool a = i % 4 == 3;
+                std::memset(&m[i], a ? 0xFF : 0, sizeof(U));
+                o[i] = a ? U(1) : U(0);
+            }
+            mask = LoadA(m);
+            one = LoadA(o);
+        }
+    }
+    // The register with 1 in the alpha lanes.
+    VI Fill(VI v) const
+    {
+        if constexpr (kKeepsAlpha<L>) return Or(AndNot(mask, v), one);
+        else return v;
+    }
+};
+
+// ---- integer quotient (8u, 16u, 16s) ------------------------------------------------
+
+// Quotient of integer elements U under rounding R: two images (the first is
+// the divisor) or an image over a constant (kConst).
+template <class U, Lay L, Rnd R, bool kConst>
+struct IntDivOp {
+    using Unit = U;
+    int sf;
+    bool wide;  // double precision: 16-bit elements below sf -7
+    VF scaleF;
+    VD scaleD;
+    AlphaLanes<U, L> alpha;
+    bool* zero = nullptr;  // set when a zero divisor is met (the row loop copies the op)
+
+    explicit IntDivOp(int scaleFactor) : sf(scaleFactor)
+    {
+        wide = sizeof(U) == 2 && sf < -7;
+        int capped = sf > 40 ? 40 : sf;
+        int lowest = sizeof(U) == 1 ? -16 : -32;
+        capped = capped < lowest ? lowest : capped;
+        scaleF = SplatF(Pow2F(-capped));
+        scaleD = SplatD(Pow2D(-capped));
+    }
+    static constexpr bool kHasVector = true;
+    bool Vector() const { return true; }
+
+    VI Quot(VI num, VI den) const
+    {
+        constexpr int kN = 4 / sizeof(U);
+        VI n[kN], d[kN], r[kN];
+        Widen32<U>(num, n);
+        Widen32<U>(den, d);
+        if (!wide) {
+            for (int i = 0; i < kN; ++i)
+                r[i] = SatI32<U, R>(DivF(MulF(CvtI32F(n[i]), scaleF), CvtI32F(d[i])));
+        } else {
+            for (int i = 0; i < kN; ++i)
+                r[i] = SatI32<U, R>(DivD(MulD(CvtLoI32D(n[i]), scaleD), CvtLoI32D(d[i])),
+                                    DivD(MulD(CvtHiI32D(n[i]), scaleD), CvtHiI32D(d[i])));
+        }
+        return Narrow32<U>(r);
+    }
+
+    VI Vec(VI a, VI b) const
+    {
+        if constexpr (kConst) {
+            return Quot(a, b);
+        } else {
+            VI den = alpha.Fill(a);
+            if (MaskBytes(Eq0(den))) *zero = true;
+            return Quot(b, den);
+        }
+    }
+    U Scalar(U a, U b) const
+    {
+        if constexpr (kConst) {
+            return QuotSat<U>(a, b, sf, R);
+        } else {
+            if (a == 0) *zero = true;
+            return QuotSat<U>(b, a, sf, R);
+        }
+    }
+
+private:
+    static VI Eq0(VI v)
+    {
+        if constexpr (sizeof(U) == 1) return EqU8(v, Zero());
+        else return EqI16(v, Zero());
+    }
+};
+
+// ---- 32f ----------------------------------------------------------------------------
+
+// The value over a zero divisor: +inf, -inf, or the quiet NaN 0x7FC00000 for a
+// zero or NaN dividend.
+inline float OverZero(float n)
+{
+    if (n > 0) return std::numeric_limits<float>::infinity();
+    if (n < 0) return -std::numeric_limits<float>::infinity();
+    return std::bit_cast<float>(0x7FC00000u);
+}
+
+inline VF OverZero(VF n)
+{
+    VF gt = GtF(n, ZeroF()), lt = LtF(n, ZeroF());
+    VF r = OrF(AndF(gt, AsFloat(SplatU32(0x7F800000u))), AndF(lt, AsFloat(SplatU32(0xFF800000u))));
+    return OrF(r, AndNotF(OrF(gt, lt), AsFloat(SplatU32(0x7FC00000u))));
+}
+
+// n / d from the reciprocal estimate refined to second order, in this order.
+inline VF RefinedQuot(VF n, VF d)
+{
+    VF r = RcpF(d);
+    VF q = MulF(n, r);
+    VF e = SubF(SplatF(1.0f), MulF(d, r));
+    return AddF(q, MulF(AddF(MulF(e, q), q), e));
+}
+
+// Div_32f: one register is one group of four (AC4: one pixel).
+template <Lay L>
+struct Div32fOp {
+    using Unit = Pvx32f;
+    AlphaLanes<Pvx32f, L> alpha;
+    bool* zero = nullptr;  // set when a zero divisor is met (the row loop copies the op)
+
+    static constexpr bool kHasVector = true;
+    bool Vector() const { return true; }
+    VI Vec(VI a, VI b) const
+    {
+        VF d = AsFloat(alpha.Fill(a));
+        VF n = AsFloat(b);
+        VF z = EqF(d, ZeroF());
+        if (!MaskF(z)) return AsInt(RefinedQuot(n, d));
+        *zero = true;
+        return AsInt(SelectF(DivF(n, d), OverZero(n), z));
+    }
+    // A tail element: a group of one.
+    Pvx32f Scalar(Pvx32f d, Pvx32f n) const
+    {
+        if (d == 0) {
+            *zero = true;
+            return OverZero(n);
+        }
+        return _mm_cvtss_f32(RefinedQuot(_mm_set_ss(n), _mm_set_ss(d)));
+    }
+};
+
+// DivC_32f: correctly rounded quotient by the constant.
+struct DivC32fOp {
+    using Unit = Pvx32f;
+    static constexpr bool kHasVector = true;
+    bool Vector() const { return true; }
+    VI Vec(VI a, VI c) const { return AsInt(DivF(AsFloat(a), AsFloat(c))); }
+    Pvx32f Scalar(Pvx32f a, Pvx32f c) const { return a / c; }
+};
+
+// ---- complex ------------------------------------------------------------------------
+
+// Complex quotient, pixel by pixel (no vector path): num / den with the parts
+// of 16sc and 32sc exact under the Sfs rule, 32fc in single precision.
+template <class T, bool kConst>
+struct CplxDivOp {
+    using Unit = T;
+    using E = Element<T>;
+    int sf;
+    bool* zero = nullptr;  // set when a zero divisor is met (the row loop copies the op)
+
+    explicit CplxDivOp(int scaleFactor) : sf(scaleFactor) {}
+    static constexpr bool kHasVector = false;
+    bool Vector() const { return false; }
+    VI Vec(VI a, VI) const { return a; }  // never called
+
+    T Scalar(T a, T b) const
+    {
+        const T& num = kConst ? a : b;
+        const T& den = kConst ? b : a;
+        T r;
+        if constexpr (std::is_floating_point_v<E>) {
+            if (den.re == 0 && den.im == 0) {
+                *zero = true;
+                r.re = OverZero(num.re);
+                r.im = OverZero(num.im);
+                return r;
+            }
+            float m = den.re * den.re + den.im * den.im;
+            r.re = (num.re * den.re + num.im * den.im) / m;
+            r.im = (num.im * den.re - num.re * den.im) / m;
+        } else {
+            Wide c = den.re, d = den.im, x = num.re, y = num.im;
+            Wide m = c * c + d * d;
+            if (m == 0) *zero = true;
+            r.re = m == 0 ? QuotSat<E>(x, 0, sf, Rnd::kEven) : QuotSat<E>(x * c + y * d, m, sf, Rnd::kEven);
+            r.im = m == 0 ? QuotSat<E>(y, 0, sf, Rnd::kEven) : QuotSat<E>(y * c - x * d, m, sf, Rnd::kEven);
+        }
+        return r;
+    }
+};
+
+// ---- running ------------------------------------------------------------------------
+
+template <class T, Lay L>
+bool HasZeroChannel(const T* v)
+{
+    for (int c = 0; c < kProcessed<L>; ++c) {
+        if constexpr (kIsComplex<T>) {
+            if (v[c].re == 0 && v[c].im == 0) return true;
+        } else {
+            if (v[c] == 0) return true;
+        }
+    }
+    return false;
+}
+
+template <class T, Lay L, Src2 K>
+PvxStatus DivRun(const T* a, int aStep, const T* b, int bStep, T* d, int dStep, PvxiSize roi, int sf, Rnd r,
+                 const T* value)
+{
+    constexpr bool kC = K == Src2::kConst;
+    bool zero = false;
+    if constexpr (std::is_same_v<T, Pvx32f>) {
+        if constexpr (kC) {
+            RunRows<T, L, K>(DivC32fOp{}, a, aStep, b, bStep, d, dStep, roi, value);
+        } else {
+            // Without alpha the channels play no part: rows run as one-channel
+            // rows of width * channels elements, so one register is one group
+            // and only the last (width * channels) mod 4 elements are singles.
+            constexpr Lay kRowLay = kKeepsAlpha<L> ? L : Lay::C1;
+            Div32fOp<kRowLay> op;
+            op.zero = &zero;
+            PvxiSize rows{roi.width * (kKeepsAlpha<L> ? 1 : kChannels<L>), roi.height};
+            if (rows.width % 4 == 0 || kKeepsAlpha<L>) {
+                RunRows<T, kRowLay, K>(op, a, aStep, b, bStep, d, dStep, rows);
+            } else {
+                // Rows with a partial last group are never merged: the groups
+                // of the next row start at its own first element.
+                for (int y = 0; y < roi.height; ++y)
+                    RunRows<T, kRowLay, K>(op, RowAt(a, aStep, y), aStep, RowAt(b, bStep, y), bStep,
+                                           RowAt(d, dStep, y), dStep, PvxiSize{rows.width, 1});
+            }
+        }
+    } else if constexpr (kIsComplex<T>) {
+        CplxDivOp<T, kC> op(sf);
+        op.zero = &zero;
+        RunRows<T, L, K>(op, a, aStep, b, bStep, d, dStep, roi, value);
+    } else {
+        auto run = [&]<Rnd R>() {
+            IntDivOp<T, L, R, kC> op(sf);
+            op.zero = &zero;
+            RunRows<T, L, K>(op, a, aStep, b, bStep, d, dStep, roi, value);
+        };
+        if (r == Rnd::kZero) run.template operator()<Rnd::kZero>();
+        else if (r == Rnd::kAway) run.template operator()<Rnd::kAway>();
+        else run.template operator()<Rnd::kEven>();
+    }
+    return zero ? pvxStsDivByZero : pvxStsNoErr;
+}
+
+constexpr Order kDivOrder = Order::kPtrSizeStep;
+
+// ---- checked bodies -------------------------------------------------------------------
+
+template <class T, Lay L>
+PvxStatus DivBody(const T* pSrc1, int src1Step, const T* pSrc2, int src2Step, T* pDst, int dstStep, PvxiSize roi,
+                  int scaleFactor = 0)
+{
+    if (PvxStatus s = CheckFrame<kDivOrder>({pSrc1, pSrc2, pDst}, roi, {src1Step, src2Step, dstStep})) return s;
+    return DivRun<T, L, Src2::kImage>(pSrc1, src1Step, pSrc2, src2Step, pDst, dstStep, roi, scaleFactor, Rnd::kEven,
+                                      nullptr);
+}
+
+// In place: pSrcDst = pSrcDst / pSrc.
+template <class T, Lay L>
+PvxStatus DivIBody(const T* pSrc, int srcStep, T* pSrcDst, int srcDstStep, PvxiSize roi, int scaleFactor = 0)
+{
+    if (PvxStatus s = CheckFrame<kDivOrder>({pSrc, pSrcDst}, roi, {srcStep, srcDstStep})) return s;
+    return DivRun<T, L, Src2::kImage>(pSrc, srcStep, pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi, scaleFactor,
+                                      Rnd::kEven, nullptr);
+}
+
+template <class T, Lay L>
+PvxStatus DivCRun(const T* pSrc, int srcStep, const T* value, T* pDst, int dstStep, PvxiSize roi, int sf)
+{
+    if (HasZeroChannel<T, L>(value)) return pvxStsDivByZeroErr;
+    return DivRun<T, L, Src2::kConst>(pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi, sf, Rnd::kEven, value);
+}
+
+template <class T, Lay L>
+PvxStatus DivCBody(const T* pSrc, int srcStep, const T* value, T* pDst, int dstStep, PvxiSize roi,
+                   int scaleFactor = 0)
+{
+    if (PvxStatus s = CheckFrame<kDivOrder>({pSrc, value, pDst}, roi, {srcStep, dstStep})) return s;
+    return DivCRun<T, L>(pSrc, srcStep, value, pDst, dstStep, roi, scaleFactor);
+}
+template <class T, Lay L>
+PvxStatus DivCBody(const T* pSrc, int srcStep, T value, T* pDst, int dstStep, PvxiSize roi, int scaleFactor = 0)
+{
+    if (PvxStatus s = CheckFrame<kDivOrder>({pSrc, pDst}, roi, {srcStep, dstStep})) return s;
+    return DivCRun<T, L>(pSrc, srcStep, &value, pDst, dstStep, roi, scaleFactor);
+}
+template <class T, Lay L>
+PvxStatus DivCIBody(const T* value, T* pSrcDst, int srcDstStep, PvxiSize roi, int scaleFactor = 0)
+{
+    if (PvxStatus s = CheckFrame<kDivOrder>({value, pSrcDst}, roi, {srcDstStep})) return s;
+    return DivCRun<T, L>(pSrcDst, srcDstStep, value, pSrcDst, srcDstStep, roi, scaleFactor);
+}
+template <class T, Lay L>
+PvxStatus DivCIBody(T value, T* pSrcDst, int srcDstStep, PvxiSize roi, int scaleFactor = 0)
+{
+    if (PvxStatus s = CheckFrame<kDivOrder>({pSrcDst}, roi, {srcDstStep})) return s;
+    return DivCRun<T, L>(pSrcDst, srcDstStep, &value, pSrcDst, srcDstStep, roi, scaleFactor);
+}
+
+// Div_Round: the rounding mode is checked after pointers, sizes and steps.
+template <class T, Lay L>
+PvxStatus DivRoundBody(const T* pSrc1, int src1Step, const T* pSrc2, int src2Step, T* pDst, int dstStep,
+                       PvxiSize roi, int roundMode, int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<kDivOrder>({pSrc1, pSrc2, pDst}, roi, {src1Step, src2Step, dstStep})) return s;
+    if (roundMode < 0 || roundMode > 2) return pvxStsRoundModeNotSupportedErr;
+    return DivRun<T, L, Src2::kImage>(pSrc1, src1Step, pSrc2, src2Step, pDst, dstStep, roi, scaleFactor,
+                                      static_cast<Rnd>(roundMode), nullptr);
+}
+template <class T, Lay L>
+PvxStatus DivRoundIBody(const T* pSrc, int srcStep, T* pSrcDst, int srcDstStep, PvxiSize roi, int roundMode,
+                        int scaleFactor)
+{
+    if (PvxStatus s = CheckFrame<kDivOrder>({pSrc, pSrcDst}, roi, {srcStep, srcDstStep})) return s;
+    if (roundMode < 0 || roundMode > 2) return pvxStsRoundModeNotSupportedErr;
+    return DivRun<T, L, Src2::kImage>(pSrc, srcStep, pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi, scaleFactor,
+                                      static_cast<Rnd>(roundMode), nullptr);
+}
+
+}  // namespace
+}  // namespace pvx
+
+#include "div.exports.inc"
