@@ -22,7 +22,9 @@ std::vector<Case>& Cases()
     return cases;
 }
 
-// Collects the real time per iteration of each run as "case/variant".
+// Collects the real time per iteration of each run as "case/variant"; with
+// --benchmark_repetitions the best repetition counts, the figure least
+// disturbed by other work on a shared machine.
 class RatioReporter : public benchmark::ConsoleReporter {
 public:
     void ReportRuns(const std::vector<Run>& runs) override
@@ -30,7 +32,9 @@ public:
         ConsoleReporter::ReportRuns(runs);
         for (const Run& r : runs) {
             if (r.error_occurred || r.run_type != Run::RT_Iteration) continue;
-            times[r.run_name.function_name] = r.GetAdjustedRealTime();
+            double t = r.GetAdjustedRealTime();
+            auto [it, fresh] = times.emplace(r.run_name.function_name, t);
+            if (!fresh && t < it->second) it->second = t;
         }
     }
     std::map<std::string, double> times;
