@@ -178,6 +178,21 @@ GuardedImage MakeImage(int width, int height, int channels, Rng& rng, ShapeOptio
     return img;
 }
 
+// A one-channel 8u mask image: mode 0 random with about a third zero bytes,
+// 1 all zero, 2 all non-zero (random values 1..255); then a fresh snapshot.
+inline void FillMask(GuardedImage& mask, int mode, Rng& rng)
+{
+    for (int y = 0; y < mask.height(); ++y) {
+        Pvx8u* m = mask.row<Pvx8u>(y);
+        for (int x = 0; x < mask.width(); ++x) {
+            if (mode == 1) m[x] = 0;
+            else if (mode == 2 || RandInt(rng, 0, 2) != 0) m[x] = static_cast<Pvx8u>(RandInt(rng, 1, 255));
+            else m[x] = 0;
+        }
+    }
+    mask.Snapshot();
+}
+
 // ---- shapes ------------------------------------------------------------------
 
 struct Shape {

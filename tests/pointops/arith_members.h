@@ -88,6 +88,24 @@ struct CallArgs {
     int sf = 0;
 };
 
+// Arguments that address the images a, b (null for one-image forms) and d
+// over roi.
+template <class T>
+CallArgs<T> ArgsOver(GuardedImage& a, GuardedImage* b, GuardedImage& d, PvxiSize roi)
+{
+    CallArgs<T> x;
+    x.a = a.ptr<T>();
+    x.aStep = a.step();
+    if (b) {
+        x.b = b->ptr<T>();
+        x.bStep = b->step();
+    }
+    x.d = d.ptr<T>();
+    x.dStep = d.step();
+    x.roi = roi;
+    return x;
+}
+
 template <class T>
 PvxStatus Invoke(const Member& m, const CallArgs<T>& x)
 {
@@ -160,14 +178,7 @@ void CheckMember(const Member& m, Shape s, Rng& rng, int sf, int mode, const std
         T r = ref(ua[i], second, ch);
         std::memcpy(&want[i * kP], &r, sizeof(T));
     }
-    CallArgs<T> x;
-    x.a = a.ptr<T>();
-    x.aStep = a.step();
-    x.b = b.ptr<T>();
-    x.bStep = b.step();
-    x.d = d.ptr<T>();
-    x.dStep = d.step();
-    x.roi = {s.width, s.height};
+    CallArgs<T> x = ArgsOver<T>(a, &b, d, {s.width, s.height});
     x.value = value.data();
     x.mode = mode;
     x.sf = sf;
@@ -197,14 +208,7 @@ void CheckOrder(const Member& m, bool stepsFirst, const std::vector<T>& value)
     Rng rng = MakeRng(77);
     const int C = m.Channels();
     GuardedImage a = MakeImage<T>(8, 3, C, rng), b = MakeImage<T>(8, 3, C, rng), d = MakeImage<T>(8, 3, C, rng);
-    CallArgs<T> ok;
-    ok.a = a.ptr<T>();
-    ok.aStep = a.step();
-    ok.b = b.ptr<T>();
-    ok.bStep = b.step();
-    ok.d = d.ptr<T>();
-    ok.dStep = d.step();
-    ok.roi = {8, 3};
+    CallArgs<T> ok = ArgsOver<T>(a, &b, d, {8, 3});
     ok.value = value.data();
     auto none = [&](PvxStatus st, PvxStatus want) { return NothingWritten(st, want, a, b, d); };
     SCOPED_TRACE(m.name);

@@ -181,19 +181,6 @@ void SeedNaNs(GuardedImage& img, int rows, int elemsPerRow)
     img.Snapshot();
 }
 
-void FillMask(GuardedImage& mask, int mode, Rng& rng)
-{
-    for (int y = 0; y < mask.height(); ++y) {
-        Pvx8u* m = mask.row<Pvx8u>(y);
-        for (int x = 0; x < mask.width(); ++x) {
-            if (mode == 1) m[x] = 0;
-            else if (mode == 2 || RandInt(rng, 0, 2) != 0) m[x] = static_cast<Pvx8u>(RandInt(rng, 1, 255));
-            else m[x] = 0;
-        }
-    }
-    mask.Snapshot();
-}
-
 // One random call of a member against the reference.
 void RunCase(const Member& m, Shape s, Rng& rng)
 {

@@ -194,14 +194,7 @@ TEST(Div, Float32GroupsOfFour)
                 for (int j = 0; j < s.width * C; ++j)
                     if (!(m.Alpha() && j % 4 == 3) && a.row<float>(y)[j] == 0) zero = true;
             }
-            CallArgs<float> x;
-            x.a = a.ptr<float>();
-            x.aStep = a.step();
-            x.b = b.ptr<float>();
-            x.bStep = b.step();
-            x.d = d.ptr<float>();
-            x.dStep = d.step();
-            x.roi = {s.width, s.height};
+            CallArgs<float> x = ArgsOver<float>(a, &b, d, {s.width, s.height});
             EXPECT_EQ(Invoke<float>(m, x), zero ? pvxStsDivByZero : pvxStsNoErr);
             EXPECT_TRUE(RegionEquals(*out, want));
             EXPECT_TRUE(a.Unchanged());
@@ -370,12 +363,7 @@ TEST(DivC, ZeroConstantAfterFrameChecks)
                 for (auto& v : value) v = RandomNonZero<T>(rng);
                 value[zeroAt] = T{};
                 if (m.Sig().rfind("C1", 0) == 0 && zeroAt > 0) break;
-                CallArgs<T> x;
-                x.a = a.ptr<T>();
-                x.aStep = a.step();
-                x.d = d.ptr<T>();
-                x.dStep = d.step();
-                x.roi = {6, 2};
+                CallArgs<T> x = ArgsOver<T>(a, nullptr, d, {6, 2});
                 x.value = value.data();
                 EXPECT_TRUE(NothingWritten(Invoke<T>(m, x), pvxStsDivByZeroErr, a, d));
                 x.aStep = 0;
@@ -386,12 +374,7 @@ TEST(DivC, ZeroConstantAfterFrameChecks)
                 std::vector<T> value(4);
                 for (auto& v : value) v = RandomNonZero<T>(rng);
                 value[3] = T{};
-                CallArgs<T> x;
-                x.a = a.ptr<T>();
-                x.aStep = a.step();
-                x.d = d.ptr<T>();
-                x.dStep = d.step();
-                x.roi = {6, 2};
+                CallArgs<T> x = ArgsOver<T>(a, nullptr, d, {6, 2});
                 x.value = value.data();
                 EXPECT_EQ(Invoke<T>(m, x), pvxStsNoErr);
             }
@@ -407,14 +390,7 @@ TEST(Div_Round, ModeCheckedAfterFrame)
             Rng rng = MakeRng(9);
             const int C = m.Channels();
             GuardedImage a = MakeImage<T>(6, 2, C, rng), b = MakeImage<T>(6, 2, C, rng), d = MakeImage<T>(6, 2, C, rng);
-            CallArgs<T> x;
-            x.a = a.ptr<T>();
-            x.aStep = a.step();
-            x.b = b.ptr<T>();
-            x.bStep = b.step();
-            x.d = d.ptr<T>();
-            x.dStep = d.step();
-            x.roi = {6, 2};
+            CallArgs<T> x = ArgsOver<T>(a, &b, d, {6, 2});
             for (int mode : {3, -1, 100}) {
                 x.mode = mode;
                 EXPECT_TRUE(NothingWritten(Invoke<T>(m, x), pvxStsRoundModeNotSupportedErr, a, b, d));

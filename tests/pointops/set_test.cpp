@@ -66,19 +66,6 @@ const Member kMembers[] = {
 #undef SET_N
 #undef SET_ONE
 
-void FillMask(GuardedImage& mask, int mode, Rng& rng)
-{
-    for (int y = 0; y < mask.height(); ++y) {
-        Pvx8u* m = mask.row<Pvx8u>(y);
-        for (int x = 0; x < mask.width(); ++x) {
-            if (mode == 1) m[x] = 0;
-            else if (mode == 2 || RandInt(rng, 0, 2) != 0) m[x] = static_cast<Pvx8u>(RandInt(rng, 1, 255));
-            else m[x] = 0;
-        }
-    }
-    mask.Snapshot();
-}
-
 // Random value bytes, sometimes one repeated byte; 4-byte members get NaN
 // bit patterns now and then.
 std::vector<Pvx8u> RandomValue(const Member& m, Rng& rng)
