@@ -131,6 +131,40 @@ TEST(Set, EveryMemberAgainstReference)
     }
 }
 
+// Regions of 64 KiB and more are filled by copying a filled block over the
+// rest: rows shorter and longer than the block, padded, contiguous and
+// bottom-up, with values whose bytes differ.
+TEST(Set, LargeRegionsAgainstReference)
+{
+    std::uint64_t seed = 900;
+    const Shape shapes[] = {{3000, 25}, {9000, 8}, {13001, 6}, {4100, 40}};
+    for (const Member& m : kMembers) {
+        if (m.kind != Kind::kAll || m.masked) continue;
+        Rng rng = MakeRng(seed++);
+        for (Shape s : shapes) {
+            for (int variant = 0; variant < 3; ++variant) {
+                const int w = s.width, h = s.height, S = m.elemBytes;
+                ShapeOptions o;
+                o.randomPad = variant != 0;
+                const bool flip = variant == 2;
+                SCOPED_TRACE(::testing::Message() << m.name << " width " << w << " height " << h << " variant "
+                                                  << variant);
+                GuardedImage dst(w, h, m.channels * S, S, rng, o);
+                dst.Randomize<Pvx8u>(rng);
+                GuardedImage mask(1, 1, 1, 1, rng, {});
+                std::vector<Pvx8u> value(4 * S);
+                for (std::size_t i = 0; i < value.size(); ++i) value[i] = static_cast<Pvx8u>(i * 37 + 11);
+                auto want = Expected(m, dst, mask, value, 0);
+                Pvx8u* d = dst.row<Pvx8u>(flip ? h - 1 : 0);
+                ASSERT_EQ(m.call({value.data(), d, flip ? -dst.step() : dst.step(), {w, h}, nullptr, 0}),
+                          pvxStsNoErr);
+                EXPECT_TRUE(RegionEquals(dst, want));
+                if (HasFatalFailure()) return;
+            }
+        }
+    }
+}
+
 // Pointers (value array, destination, mask) -8, then width and height -6;
 // steps are never checked, and a step of 0 fills the first row again.
 TEST(Set, CheckOrderZeroStepsAndNothingWrittenOnError)
