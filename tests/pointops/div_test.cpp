@@ -260,6 +260,31 @@ TEST(Div, Float32EdgeCases)
     EXPECT_EQ(pvxiDiv_32f_C1R(d + 3, 20, n + 3, 20, q, 20, {5, 1}), pvxStsNoErr);
 }
 
+TEST(Div, Float32NonFiniteDivisorsAndOneZeroAmongSixteen)
+{
+    // Infinite and NaN divisors are not zero: their groups keep the refined
+    // quotient. A single zero anywhere among sixteen elements sends only its
+    // own group to exact division.
+    const float special[] = {INFINITY, -INFINITY, NAN, 0.0f, -0.0f};
+    for (float s : special) {
+        for (int at = 0; at < 16; ++at) {
+            float d[16], n[16], q[16];
+            for (int j = 0; j < 16; ++j) {
+                d[j] = 0.75f + 3 * j;
+                n[j] = -40.0f + 7 * j;
+            }
+            d[at] = s;
+            ASSERT_EQ(pvxiDiv_32f_C1R(d, 64, n, 64, q, 64, {16, 1}), s == 0 ? pvxStsDivByZero : pvxStsNoErr);
+            for (int j = 0; j < 16; ++j) {
+                bool exact = s == 0 && j / 4 == at / 4;
+                float want = exact ? (d[j] == 0 ? OverZero(n[j]) : n[j] / d[j]) : RcpQuot(n[j], d[j]);
+                if (std::isnan(want)) EXPECT_TRUE(std::isnan(q[j])) << s << " " << at << " " << j;
+                else EXPECT_EQ(q[j], want) << s << " " << at << " " << j;
+            }
+        }
+    }
+}
+
 TEST(Div, IntegerZeroDivisorAndExtremeScaleFactors)
 {
     Pvx8u d[4] = {0, 0, 0, 1}, n[4] = {7, 0, 255, 255}, q[4];
