@@ -131,18 +131,22 @@ PvxStatus CopyBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize ro
 
 // Interleaved to planar and back. The 4-byte members stream their stores
 // when they write more than 786433 bytes and at least the largest cache.
+// Planes merged into 1- and 2-byte pixels stream when what the call reads and
+// writes together reaches the largest cache: the source then pushes the
+// written pixels out of the cache before anyone reads them, and streaming
+// saves the read of every written line (4K 8u frames, 25 MB written: about
+// 1.4 times faster). Splitting into planes keeps ordinary stores: three or
+// four streamed planes run about half as fast on the processors we measure.
 template <Lay L, class T>
 void RunPlanar(const Byte* const* in, int inStep, Byte* const* out, int outStep, PvxiSize roi)
 {
     using M = typename MapOf<sizeof(T), L>::type;
-    if constexpr (sizeof(T) == 4) {
-        std::int64_t bytes = static_cast<std::int64_t>(roi.width) * roi.height * M::kIn * 4;
-        if (UseNonTemporal(bytes, kNtThresholdLarge)) {
-            MoveRows<M, true>(in, inStep, out, outStep, roi);
-            return;
-        }
-    }
-    MoveRows<M>(in, inStep, out, outStep, roi);
+    const std::int64_t written = static_cast<std::int64_t>(roi.width) * roi.height * M::kIn * sizeof(T);
+    bool nt = false;
+    if constexpr (sizeof(T) == 4) nt = UseNonTemporal(written, kNtThresholdLarge);
+    else if constexpr (M::kInPlanar) nt = UseNonTemporal(2 * written, kNtThresholdLarge);
+    if (nt) MoveRows<M, true>(in, inStep, out, outStep, roi);
+    else MoveRows<M>(in, inStep, out, outStep, roi);
 }
 
 template <class T, Lay L>

@@ -103,6 +103,42 @@ TEST(MoveStreaming, MirrorLargeFourChannelRegions)
     MirrorLarge(pvxiMirror_32s_AC4R, true, 181, 190, 16);
 }
 
+// Planes merged into pixels stream once what the call reads and writes
+// reaches the cache; the planes are stacked in one image, so they share its
+// step and the padding between its rows.
+template <class T>
+void MergeLarge(PvxStatus (*fn)(const T* const*, int, T*, int, PvxiSize), int ch, int w, int h, std::uint64_t seed)
+{
+    Rng rng = MakeRng(seed);
+    for (bool aligned : {true, false}) {
+        SCOPED_TRACE(::testing::Message() << "Merge " << sizeof(T) << "-byte P" << ch << " " << w << "x" << h
+                                          << " aligned " << aligned);
+        ShapeOptions o{!aligned, !aligned, false, 0};
+        GuardedImage planes = MakeImage<T>(w, h * ch, 1, rng, o), dst = MakeImage<T>(w, h, ch, rng, o);
+        GuardedImage before = dst;
+        const T* p[4] = {};
+        for (int c = 0; c < ch; ++c) p[c] = planes.row<T>(c * h);
+        SmallCache cache(kCache);
+        ASSERT_EQ(fn(p, planes.step(), dst.ptr<T>(), dst.step(), {w, h}), pvxStsNoErr);
+        EXPECT_GT(gCacheQueries.load(), 0);
+        for (int y = 0; y < h; ++y)
+            for (int x = 0; x < w; ++x)
+                for (int c = 0; c < ch; ++c) before.row<T>(y)[x * ch + c] = planes.row<T>(c * h + y)[x];
+        EXPECT_TRUE(RegionEquals(dst, before.Packed<T>()));
+    }
+}
+
+TEST(MoveStreaming, MergeLargeRegions)
+{
+    // Above the thresholds: 393217 bytes written for 1- and 2-byte
+    // elements (read and written above 786433), 786433 written for 32f.
+    MergeLarge(pvxiCopy_8u_P3C3R, 3, 401, 337, 21);
+    MergeLarge(pvxiCopy_8u_P4C4R, 4, 331, 301, 22);
+    MergeLarge(pvxiCopy_16s_P3C3R, 3, 261, 257, 23);
+    MergeLarge(pvxiCopy_16u_P4C4R, 4, 211, 237, 24);
+    MergeLarge(pvxiCopy_32f_P3C3R, 3, 271, 251, 25);
+}
+
 TEST(MoveStreaming, SmallRegionsDoNotAsk)
 {
     // Below the thresholds the cache size is not needed.
