@@ -1,12 +1,24 @@
 // Runs every registered case through Google Benchmark and prints the ratio
 // table. With --pvx_markdown=FILE the table is also written as markdown.
+//
+// With --pvx_rounds=N the cases that --benchmark_filter selects are timed
+// interleaved instead: N rounds, each running pvx, the peer and memref in
+// turn (the first of them rotating from round to round) for a batch of about
+// 20 ms of back-to-back calls, the first call of a batch untimed to warm the
+// caches. The table then holds the median over the rounds of the time per
+// call. On a shared machine the load changes from second to second; batches
+// interleaved this closely see the same load, so their ratio holds steady
+// from run to run where the ratio of separately timed runs does not.
 #include <opencv2/core.hpp>
 
 #include <algorithm>
+#include <chrono>
 #include <cstdio>
+#include <cstdlib>
 #include <cstring>
 #include <fstream>
 #include <map>
+#include <regex>
 #include <memory>
 #include <string>
 #include <vector>
@@ -40,6 +52,47 @@ public:
     std::map<std::string, double> times;
 };
 
+// Median over the rounds of the microseconds per call of a batch.
+std::map<std::string, double> Interleaved(const std::regex& filter, int rounds)
+{
+    std::map<std::string, double> times;
+    for (const Case& c : Cases()) {
+        if (!std::regex_search(c.name, filter)) continue;
+        const std::pair<const char*, const std::function<void()>*> all[] = {
+            {"pvx", &c.pvx}, {"peer", &c.peer}, {"memref", &c.memref}};
+        std::vector<std::pair<const char*, const std::function<void()>*>> fns;
+        for (const auto& f : all)
+            if (*f.second) fns.push_back(f);
+        using Clock = std::chrono::steady_clock;
+        auto since = [](Clock::time_point t0) {
+            return std::chrono::duration<double, std::micro>(Clock::now() - t0).count();
+        };
+        std::vector<int> batch(fns.size());
+        for (std::size_t i = 0; i < fns.size(); ++i) {
+            (*fns[i].second)();
+            auto t0 = Clock::now();
+            (*fns[i].second)();
+            batch[i] = std::max(1, static_cast<int>(20000.0 / std::max(since(t0), 1.0)));
+        }
+        std::vector<std::vector<double>> us(fns.size());
+        for (int r = 0; r < rounds; ++r)
+            for (std::size_t k = 0; k < fns.size(); ++k) {
+                std::size_t i = (k + static_cast<std::size_t>(r)) % fns.size();
+                const std::function<void()>& fn = *fns[i].second;
+                fn();
+                auto t0 = Clock::now();
+                for (int j = 0; j < batch[i]; ++j) fn();
+                us[i].push_back(since(t0) / batch[i]);
+            }
+        for (std::size_t i = 0; i < fns.size(); ++i) {
+            std::sort(us[i].begin(), us[i].end());
+            times[c.name + "/" + fns[i].first] = us[i][us[i].size() / 2];
+        }
+        std::fprintf(stderr, "timed %s\n", c.name.c_str());
+    }
+    return times;
+}
+
 }  // namespace
 
 void Register(Case c)
@@ -52,11 +105,14 @@ void Register(Case c)
 int main(int argc, char** argv)
 {
     using namespace pvxbench;
-    std::string markdown;
+    std::string markdown, filter = ".";
+    int rounds = 0;
     std::vector<char*> args;
     for (int i = 0; i < argc; ++i) {
         if (std::strncmp(argv[i], "--pvx_markdown=", 15) == 0) markdown = argv[i] + 15;
+        else if (std::strncmp(argv[i], "--pvx_rounds=", 13) == 0) rounds = std::atoi(argv[i] + 13);
         else args.push_back(argv[i]);
+        if (std::strncmp(argv[i], "--benchmark_filter=", 19) == 0) filter = argv[i] + 19;
     }
     int n = static_cast<int>(args.size());
     cv::setNumThreads(1);
@@ -81,7 +137,8 @@ int main(int argc, char** argv)
     }
 
     RatioReporter reporter;
-    benchmark::RunSpecifiedBenchmarks(&reporter);
+    if (rounds > 0) reporter.times = Interleaved(std::regex(filter), rounds);
+    else benchmark::RunSpecifiedBenchmarks(&reporter);
 
     std::string table = "| case | pvx us | peer us | peer/pvx | memref/pvx |\n|---|---:|---:|---:|---:|\n";
     for (const Case& c : Cases()) {
