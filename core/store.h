@@ -24,4 +24,15 @@ inline bool UseNonTemporal(std::int64_t bytesWritten, std::int64_t threshold)
     return bytesWritten >= cache;
 }
 
+// The streamed-store choice of calls that read as much as they write (the
+// arithmetic families): streamed once the bytes read and written reach half
+// the largest cache and exceed the large-region threshold.
+inline bool StreamWorkingSet(std::int64_t bytesTouched)
+{
+    if (bytesTouched <= kNtThresholdLarge) return false;
+    int cache = 0;
+    if (pvxGetMaxCacheSizeB(&cache) != pvxStsNoErr) return false;
+    return bytesTouched >= cache / 2;
+}
+
 }  // namespace pvx

@@ -321,7 +321,8 @@ PvxStatus DivRun(const T* a, int aStep, const T* b, int bStep, T* d, int dStep, 
                 RunRows<T, kRowLay, K>(op, a, aStep, b, bStep, d, dStep, rows);
             } else {
                 // Rows with a partial last group are never merged: the groups
-                // of the next row start at its own first element.
+                // of the next row start at its own first element. Run one at
+                // a time, they are too small to stream their stores.
                 for (int y = 0; y < roi.height; ++y)
                     RunRows<T, kRowLay, K>(op, RowAt(a, aStep, y), aStep, RowAt(b, bStep, y), bStep,
                                            RowAt(d, dStep, y), dStep, PvxiSize{rows.width, 1});

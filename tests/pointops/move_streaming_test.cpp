@@ -1,6 +1,6 @@
-// Large regions of Transpose and Mirror are written with non-temporal stores
-// when they are at least as large as the largest cache; the pixels must be
-// the same as with ordinary stores. Real caches are tens of megabytes, so this
+// Large regions of Transpose, Mirror, planar copies and arithmetic are
+// written with non-temporal stores when they are large against the largest
+// cache; the pixels must be the same as with ordinary stores. Real caches are tens of megabytes, so this
 // file stands in for the core library's cache query: the library calls
 // pvxGetMaxCacheSizeB through the dynamic linker, which finds this definition
 // first. Unless a test sets a size, it forwards to the core library.
@@ -137,6 +137,57 @@ TEST(MoveStreaming, MergeLargeRegions)
     MergeLarge(pvxiCopy_16s_P3C3R, 3, 261, 257, 23);
     MergeLarge(pvxiCopy_16u_P4C4R, 4, 211, 237, 24);
     MergeLarge(pvxiCopy_32f_P3C3R, 3, 271, 251, 25);
+}
+
+// Arithmetic streams its stores once a call reads and writes half the cache;
+// the pixels and the status must be those of the ordinary stores.
+template <class Call>
+void ArithLarge(const char* name, int elemBytes, int ch, int w, int h, std::uint64_t seed, Call call)
+{
+    Rng rng = MakeRng(seed);
+    for (bool aligned : {true, false}) {
+        SCOPED_TRACE(::testing::Message() << name << " " << w << "x" << h << " aligned " << aligned);
+        ShapeOptions o{!aligned, !aligned, false, 0};
+        GuardedImage a(w, h, ch * elemBytes, elemBytes, rng, o), b(w, h, ch * elemBytes, elemBytes, rng, o);
+        a.Randomize<Pvx8u>(rng);
+        b.Randomize<Pvx8u>(rng);
+        if (elemBytes == 4) {
+            // Finite floats, and a zero in every divisor row.
+            for (int y = 0; y < h; ++y)
+                for (int x = 0; x < w * ch; ++x) {
+                    a.row<Pvx32f>(y)[x] = static_cast<Pvx32f>(RandInt(rng, -999, 999)) / 7;
+                    b.row<Pvx32f>(y)[x] = static_cast<Pvx32f>(RandInt(rng, -999, 999)) / 3;
+                }
+            for (int y = 0; y < h; ++y) a.row<Pvx32f>(y)[(y * 7) % (w * ch)] = 0;
+        }
+        GuardedImage plain(w, h, ch * elemBytes, elemBytes, rng, o);
+        GuardedImage streamed = plain;
+        PvxStatus want = call(a, b, plain);
+        SmallCache cache(kCache);
+        EXPECT_EQ(call(a, b, streamed), want);
+        EXPECT_GT(gCacheQueries.load(), 0);
+        EXPECT_TRUE(RegionEquals(streamed, plain.Packed<Pvx8u>()));
+    }
+}
+
+TEST(MoveStreaming, ArithmeticLargeRegions)
+{
+    // 3 x 297 x 301 x 4 bytes: above 786433 read and written.
+    ArithLarge("Add_32f_C1R", 4, 1, 297, 301, 31, [](GuardedImage& a, GuardedImage& b, GuardedImage& d) {
+        return pvxiAdd_32f_C1R(a.ptr<Pvx32f>(), a.step(), b.ptr<Pvx32f>(), b.step(), d.ptr<Pvx32f>(), d.step(),
+                               {297, 301});
+    });
+    ArithLarge("Div_32f_C3R", 4, 3, 172, 203, 32, [](GuardedImage& a, GuardedImage& b, GuardedImage& d) {
+        return pvxiDiv_32f_C3R(a.ptr<Pvx32f>(), a.step(), b.ptr<Pvx32f>(), b.step(), d.ptr<Pvx32f>(), d.step(),
+                               {172, 203});
+    });
+    ArithLarge("Sub_16s_C3RSfs", 2, 3, 251, 199, 33, [](GuardedImage& a, GuardedImage& b, GuardedImage& d) {
+        return pvxiSub_16s_C3RSfs(a.ptr<Pvx16s>(), a.step(), b.ptr<Pvx16s>(), b.step(), d.ptr<Pvx16s>(), d.step(),
+                                  {251, 199}, 1);
+    });
+    ArithLarge("MulC_8u_C1RSfs", 1, 1, 701, 613, 34, [](GuardedImage& a, GuardedImage&, GuardedImage& d) {
+        return pvxiMulC_8u_C1RSfs(a.ptr<Pvx8u>(), a.step(), 3, d.ptr<Pvx8u>(), d.step(), {701, 613}, 2);
+    });
 }
 
 TEST(MoveStreaming, SmallRegionsDoNotAsk)
