@@ -24,8 +24,8 @@ inline bool UseNonTemporal(std::int64_t bytesWritten, std::int64_t threshold)
     return bytesWritten >= cache;
 }
 
-// The streamed-store choice of calls that read as much as they write (the
-// arithmetic families): streamed once the bytes read and written reach half
+// The streamed-store choice of calls that read as much as they write
+// (arithmetic, planes merged into pixels): streamed once the bytes read and written reach half
 // the largest cache and exceed the large-region threshold.
 inline bool StreamWorkingSet(std::int64_t bytesTouched)
 {

@@ -467,7 +467,7 @@ void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const t
 // in place, no alpha kept). At that size the destination is pushed out of the
 // cache by the sources before anyone reads it, and streaming saves the read
 // of every destination line and leaves the sources cached: 1080p frames of
-// 25 to 37 MB a call (Add_32f, AddC_32fc, Sub_16s C3) run 1.1 to 1.4 times
+// 25 to 37 MB a call (Add_32f, AddC_32fc, Sub_16s C3) run 1.2 to 1.4 times
 // faster. Below that, on frames that stay in the cache, streaming is slower
 // (Add_8u at 6 MB: 1.3 times), so those keep ordinary stores.
 template <class T, Lay L, Src2 K, class Op>

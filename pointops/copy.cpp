@@ -135,8 +135,9 @@ PvxStatus CopyBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize ro
 // what the call reads and writes together reaches half the largest cache:
 // the source then pushes the written pixels out of the cache before anyone
 // reads them, and streaming saves the read of every written line (4K 8u
-// frames, 25 MB written: about 1.4 times faster). Splitting into planes keeps ordinary stores: three or
-// four streamed planes run about half as fast on the processors we measure.
+// frames, 25 MB written: about 1.25 times faster). Splitting into planes
+// keeps ordinary stores: three or four streamed planes run about half as
+// fast on the processors we measure.
 template <Lay L, class T>
 void RunPlanar(const Byte* const* in, int inStep, Byte* const* out, int outStep, PvxiSize roi)
 {
