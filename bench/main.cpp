@@ -18,8 +18,8 @@
 #include <cstring>
 #include <fstream>
 #include <map>
-#include <regex>
 #include <memory>
+#include <regex>
 #include <string>
 #include <vector>
 

@@ -482,8 +482,9 @@ void RunRows(const Op& op, const T* a, int aStep, const T* b, int bStep, T* d, i
     int rows = roi.height;
     bool merged = K == Src2::kImage ? RowsContiguous(rowBytes, {aStep, bStep, dStep})
                                     : RowsContiguous(rowBytes, {aStep, dStep});
+    constexpr bool kCanStream = !kKeepsAlpha<L> && Op::kHasVector;
     bool nt = false;
-    if constexpr (!kKeepsAlpha<L> && Op::kHasVector) {
+    if constexpr (kCanStream) {
         const void* out = d;
         if (op.Vector() && out != a && out != b) {
             std::int64_t images = K == Src2::kImage ? 3 : 2;
@@ -499,7 +500,7 @@ void RunRows(const Op& op, const T* a, int aStep, const T* b, int bStep, T* d, i
         const U* rb = K == Src2::kImage ? reinterpret_cast<const U*>(RowAt(b, bStep, y)) : ra;
         U* rd = reinterpret_cast<U*>(RowAt(d, dStep, y));
         if (simd::IsAligned(ra) && simd::IsAligned(rb) && simd::IsAligned(rd)) {
-            if constexpr (!kKeepsAlpha<L> && Op::kHasVector)
+            if constexpr (kCanStream)
                 if (nt) {
                     ArithRow<Op, T, L, K, true, true>(op, pat, ra, rb, rd, n);
                     continue;

@@ -1,6 +1,5 @@
 // Set: fills a region, one channel or a masked part of it with a constant,
 // bit-exact for every element type.
-#include <algorithm>
 #include <cstring>
 
 #include "check.h"

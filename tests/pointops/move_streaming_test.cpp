@@ -115,7 +115,7 @@ void MergeLarge(PvxStatus (*fn)(const T* const*, int, T*, int, PvxiSize), int ch
                                           << " aligned " << aligned);
         ShapeOptions o{!aligned, !aligned, false, 0};
         GuardedImage planes = MakeImage<T>(w, h * ch, 1, rng, o), dst = MakeImage<T>(w, h, ch, rng, o);
-        GuardedImage before = dst;
+        GuardedImage want = dst;
         const T* p[4] = {};
         for (int c = 0; c < ch; ++c) p[c] = planes.row<T>(c * h);
         SmallCache cache(kCache);
@@ -123,8 +123,8 @@ void MergeLarge(PvxStatus (*fn)(const T* const*, int, T*, int, PvxiSize), int ch
         EXPECT_GT(gCacheQueries.load(), 0);
         for (int y = 0; y < h; ++y)
             for (int x = 0; x < w; ++x)
-                for (int c = 0; c < ch; ++c) before.row<T>(y)[x * ch + c] = planes.row<T>(c * h + y)[x];
-        EXPECT_TRUE(RegionEquals(dst, before.Packed<T>()));
+                for (int c = 0; c < ch; ++c) want.row<T>(y)[x * ch + c] = planes.row<T>(c * h + y)[x];
+        EXPECT_TRUE(RegionEquals(dst, want.Packed<T>()));
     }
 }
 
