@@ -331,6 +331,27 @@ inline std::ptrdiff_t StreamStart(Byte* const* out)
     return -1;
 }
 
+// The whole blocks of pixels [x, end), four a step while four remain, so
+// that every planar stream is read or written a whole 64-byte line at a time;
+// returns the first pixel left over. Four a step made 8-bit merges of
+// 1080p frames held in the cache about 1.1 times faster in the median of
+// interleaved runs (the best runs were alike) and streamed 4K merges about
+// 1.08 times faster.
+template <class M, bool kConst, bool kStream>
+inline std::ptrdiff_t MoveBlocks(const Byte* const* in, Byte* const* out, std::ptrdiff_t x, std::ptrdiff_t end,
+                                 const VI* pat)
+{
+    constexpr std::ptrdiff_t kN = 16 / M::kS;
+    for (; x + 4 * kN <= end; x += 4 * kN) {
+        MoveBlock<M, kConst, kStream>(in, out, x, pat);
+        MoveBlock<M, kConst, kStream>(in, out, x + kN, pat);
+        MoveBlock<M, kConst, kStream>(in, out, x + 2 * kN, pat);
+        MoveBlock<M, kConst, kStream>(in, out, x + 3 * kN, pat);
+    }
+    for (; x + kN <= end; x += kN) MoveBlock<M, kConst, kStream>(in, out, x, pat);
+    return x;
+}
+
 // Moves w pixels of one row. kNt: stream the output (non-temporal stores)
 // where the output streams can be aligned; the unaligned head and the tail go
 // through the scalar path, and the caller fences after its last row.
@@ -352,12 +373,12 @@ void MoveRow(const Byte* const* inStreams, Byte* const* outStreams, std::ptrdiff
         std::ptrdiff_t h = StreamStart<M>(out);
         if (h >= 0 && h + kN <= end) {
             MoveScalar<M, kConst>(in, out, 0, h, patBytes);
-            for (x = h; x + kN <= end; x += kN) MoveBlock<M, kConst, true>(in, out, x, pat);
+            x = MoveBlocks<M, kConst, true>(in, out, h, end, pat);
             MoveScalar<M, kConst>(in, out, x, w, patBytes);
             return;
         }
     }
-    for (; x + kN <= end; x += kN) MoveBlock<M, kConst, false>(in, out, x, pat);
+    x = MoveBlocks<M, kConst, false>(in, out, x, end, pat);
     MoveScalar<M, kConst>(in, out, x, w, patBytes);
 }
 
