@@ -25,8 +25,9 @@ inline bool UseNonTemporal(std::int64_t bytesWritten, std::int64_t threshold)
 }
 
 // The streamed-store choice of calls that read as much as they write
-// (arithmetic, planes merged into pixels): streamed once the bytes read and written reach half
-// the largest cache and exceed the large-region threshold.
+// (arithmetic, planes merged into pixels, channel swaps): streamed once the
+// bytes read and written reach half the largest cache and exceed the
+// large-region threshold.
 inline bool StreamWorkingSet(std::int64_t bytesTouched)
 {
     if (bytesTouched <= kNtThresholdLarge) return false;

@@ -1,11 +1,13 @@
-// Large regions of Transpose, Mirror, planar copies and arithmetic are
-// written with non-temporal stores when they are large against the largest
-// cache; the pixels must be the same as with ordinary stores. Real caches are tens of megabytes, so this
-// file stands in for the core library's cache query: the library calls
-// pvxGetMaxCacheSizeB through the dynamic linker, which finds this definition
-// first. Unless a test sets a size, it forwards to the core library.
+// Large regions of Transpose, Mirror, planar copies, channel swaps and
+// arithmetic are written with non-temporal stores when they are large against
+// the largest cache; the pixels must be the same as with ordinary stores.
+// Real caches are tens of megabytes, so this file stands in for the core
+// library's cache query: the library calls pvxGetMaxCacheSizeB through the
+// dynamic linker, which finds this definition first. Unless a test sets a
+// size, it forwards to the core library.
 #include <dlfcn.h>
 
+#include <algorithm>
 #include <atomic>
 
 #include "harness.h"
@@ -188,6 +190,59 @@ TEST(MoveStreaming, ArithmeticLargeRegions)
     ArithLarge("MulC_8u_C1RSfs", 1, 1, 701, 613, 34, [](GuardedImage& a, GuardedImage&, GuardedImage& d) {
         return pvxiMulC_8u_C1RSfs(a.ptr<Pvx8u>(), a.step(), 3, d.ptr<Pvx8u>(), d.step(), {701, 613}, 2);
     });
+}
+
+// Channel swaps stream once what the call reads and writes reaches half the
+// cache, on destination rows that start aligned; the pixels must be those of
+// the order. Forms that keep destination channels, and in-place calls, keep
+// ordinary stores and must be just as right.
+template <class T>
+void SwapLarge(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, const int*), int cin, int cout,
+               std::vector<int> order, int w, int h, std::uint64_t seed)
+{
+    Rng rng = MakeRng(seed);
+    struct Shape {
+        bool srcUnaligned, dstUnaligned;
+    };
+    const bool keeps = std::any_of(order.begin(), order.end(), [cin](int c) { return c >= cin; });
+    for (Shape sh : {Shape{false, false}, Shape{true, false}, Shape{true, true}}) {
+        SCOPED_TRACE(::testing::Message() << "SwapChannels " << sizeof(T) << "-byte C" << cin << "C" << cout << " "
+                                          << w << "x" << h << " unaligned src " << sh.srcUnaligned << " dst "
+                                          << sh.dstUnaligned);
+        // Padded steps (when unaligned) give rows of both alignments.
+        GuardedImage src = MakeImage<T>(w, h, cin, rng, {sh.srcUnaligned, sh.srcUnaligned, false, 0});
+        GuardedImage dst = MakeImage<T>(w, h, cout, rng, {sh.srcUnaligned, sh.dstUnaligned, false, 0});
+        GuardedImage want = dst;
+        for (int y = 0; y < h; ++y)
+            for (int x = 0; x < w; ++x)
+                for (int c = 0; c < cout; ++c)
+                    if (order[c] < cin) want.row<T>(y)[x * cout + c] = src.row<T>(y)[x * cin + order[c]];
+        SmallCache cache(kCache);
+        ASSERT_EQ(fn(src.ptr<T>(), src.step(), dst.ptr<T>(), dst.step(), {w, h}, order.data()), pvxStsNoErr);
+        if (keeps) EXPECT_EQ(gCacheQueries.load(), 0);
+        else EXPECT_GT(gCacheQueries.load(), 0);
+        EXPECT_TRUE(RegionEquals(dst, want.Packed<T>()));
+    }
+}
+
+TEST(MoveStreaming, SwapChannelsLargeRegions)
+{
+    // Above 786433 bytes read and written.
+    SwapLarge(pvxiSwapChannels_8u_C3R, 3, 3, {2, 1, 0}, 401, 337, 41);
+    SwapLarge(pvxiSwapChannels_16u_C4R, 4, 4, {3, 0, 2, 1}, 211, 241, 42);
+    SwapLarge(pvxiSwapChannels_32f_C4C3R, 4, 3, {2, 3, 0}, 181, 161, 43);
+    SwapLarge(pvxiSwapChannels_16s_C3C4R, 3, 4, {2, 1, 0, 3}, 231, 219, 44);  // keeps channel 3
+    // In place, same pointer: ordinary stores.
+    Rng rng = MakeRng(45);
+    GuardedImage img = MakeImage<Pvx8u>(401, 337, 3, rng, {false, false, false, 0});
+    GuardedImage want = img;
+    for (int y = 0; y < 337; ++y)
+        for (int x = 0; x < 401; ++x) std::swap(want.row<Pvx8u>(y)[3 * x], want.row<Pvx8u>(y)[3 * x + 2]);
+    const int order[3] = {2, 1, 0};
+    SmallCache cache(kCache);
+    ASSERT_EQ(pvxiSwapChannels_8u_C3R(img.ptr<Pvx8u>(), img.step(), img.ptr<Pvx8u>(), img.step(), {401, 337}, order),
+              pvxStsNoErr);
+    EXPECT_TRUE(RegionEquals(img, want.Packed<Pvx8u>()));
 }
 
 TEST(MoveStreaming, SmallRegionsDoNotAsk)
