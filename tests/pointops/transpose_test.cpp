@@ -35,15 +35,16 @@ const Members<Pvx32f> k32f{{pvxiTranspose_32f_C1R, pvxiTranspose_32f_C3R, pvxiTr
 
 const int kChannels[3] = {1, 3, 4};
 
-// Sides around every block size (2, 4, 8, 16) and the tiles (16, 32, 64).
+// Sides around every block size (2, 4, 8, 16), and random sides that cross
+// the tiles (16 to 256 pixels, by pixel size) in both directions.
 std::vector<Shape> TransposeShapes(Rng& rng, int count)
 {
     const int sides[] = {1, 2, 3, 4, 5, 7, 8, 9, 15, 16, 17, 31, 32, 33, 63, 64, 65, 67};
     std::vector<Shape> out;
     for (int s : sides) out.push_back({s, sides[RandInt(rng, 0, 17)]});
     while (static_cast<int>(out.size()) < count) {
-        int w = RandInt(rng, 0, 2) ? RandInt(rng, 1, 300) : sides[RandInt(rng, 0, 17)];
-        int h = RandInt(rng, 0, 2) ? RandInt(rng, 1, 150) : sides[RandInt(rng, 0, 17)];
+        int w = RandInt(rng, 0, 2) ? RandInt(rng, 1, 560) : sides[RandInt(rng, 0, 17)];
+        int h = RandInt(rng, 0, 2) ? RandInt(rng, 1, 280) : sides[RandInt(rng, 0, 17)];
         out.push_back({w, h});
     }
     return out;
