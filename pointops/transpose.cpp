@@ -9,10 +9,10 @@
 // Kernels work on bytes, templated by pixel size, so every type and channel
 // count of one pixel size shares them. Whole blocks are transposed in vector
 // registers (16 x 16 and 8 x 8 bytes, 8 x 8 and 4 x 4 16-bit, 4 x 4 32-bit,
-// 2 x 2 64-bit), walked in cache-sized tiles; the three-channel pixel sizes
-// move pixel by pixel within the tiles. Regions of more than 256 kB that are
-// at least as large as the largest cache are written through a tile buffer
-// with non-temporal stores.
+// 2 x 2 64-bit, and 4 x 4 and 2 x 2 of the three-channel pixels), walked in
+// cache-sized tiles. Regions of more than 256 kB that are at least as large
+// as the largest cache are written through a tile buffer with non-temporal
+// stores.
 #include <algorithm>
 #include <cstring>
 
@@ -115,6 +115,47 @@ inline void Block32u4(const Bytes* s, std::ptrdiff_t ss, Bytes* d, std::ptrdiff_
     StoreU(d + 3 * ds, InterleaveHi64(a1, a3));
 }
 
+// The three-channel pixel sizes share blocks whose rows are 12 bytes: 4 x 4
+// pixels of 3 bytes, 2 x 2 of 6 bytes. Each row is loaded exactly (nothing
+// past its last byte is read or written, so a region may end where the
+// caller's memory ends, and an in-place exchange never touches the tile
+// beside it), its pixels spread to 4- or 8-byte lanes, the lanes transposed,
+// and each column packed back to 12 bytes.
+inline VI Load12(const Bytes* p)
+{
+    std::int32_t tail;
+    std::memcpy(&tail, p + 8, 4);
+    return _mm_insert_epi32(LoadLo64(p), tail, 2);
+}
+inline void Store12(Bytes* p, VI v)
+{
+    StoreLo64(p, v);
+    std::int32_t tail = _mm_extract_epi32(v, 2);
+    std::memcpy(p + 8, &tail, 4);
+}
+
+inline void Block24u4(const Bytes* s, std::ptrdiff_t ss, Bytes* d, std::ptrdiff_t ds)
+{
+    const VI spread = _mm_setr_epi8(0, 1, 2, -1, 3, 4, 5, -1, 6, 7, 8, -1, 9, 10, 11, -1);
+    const VI pack = _mm_setr_epi8(0, 1, 2, 4, 5, 6, 8, 9, 10, 12, 13, 14, -1, -1, -1, -1);
+    VI r0 = ShuffleBytes(Load12(s), spread), r1 = ShuffleBytes(Load12(s + ss), spread);
+    VI r2 = ShuffleBytes(Load12(s + 2 * ss), spread), r3 = ShuffleBytes(Load12(s + 3 * ss), spread);
+    Transpose4x32(r0, r1, r2, r3);
+    Store12(d, ShuffleBytes(r0, pack));
+    Store12(d + ds, ShuffleBytes(r1, pack));
+    Store12(d + 2 * ds, ShuffleBytes(r2, pack));
+    Store12(d + 3 * ds, ShuffleBytes(r3, pack));
+}
+
+inline void Block48u2(const Bytes* s, std::ptrdiff_t ss, Bytes* d, std::ptrdiff_t ds)
+{
+    const VI spread = _mm_setr_epi8(0, 1, 2, 3, 4, 5, -1, -1, 6, 7, 8, 9, 10, 11, -1, -1);
+    const VI pack = _mm_setr_epi8(0, 1, 2, 3, 4, 5, 8, 9, 10, 11, 12, 13, -1, -1, -1, -1);
+    VI r0 = ShuffleBytes(Load12(s), spread), r1 = ShuffleBytes(Load12(s + ss), spread);
+    Store12(d, ShuffleBytes(InterleaveLo64(r0, r1), pack));
+    Store12(d + ds, ShuffleBytes(InterleaveHi64(r0, r1), pack));
+}
+
 // 2 x 2 64-bit pixels.
 inline void Block64u2(const Bytes* s, std::ptrdiff_t ss, Bytes* d, std::ptrdiff_t ds)
 {
@@ -133,6 +174,8 @@ inline void Block(const Bytes* s, std::ptrdiff_t ss, Bytes* d, std::ptrdiff_t ds
     else if constexpr (PS == 2 && K == 8) Block16u8(s, ss, d, ds);
     else if constexpr (PS == 2 && K == 4) Block16u4(s, ss, d, ds);
     else if constexpr (PS == 4 && K == 4) Block32u4(s, ss, d, ds);
+    else if constexpr (PS == 3 && K == 4) Block24u4(s, ss, d, ds);
+    else if constexpr (PS == 6 && K == 2) Block48u2(s, ss, d, ds);
     else if constexpr (PS == 8 && K == 2) Block64u2(s, ss, d, ds);
     else if constexpr (PS == 16 && K == 1) StoreU(d, LoadU(s));
     else {
@@ -141,7 +184,8 @@ inline void Block(const Bytes* s, std::ptrdiff_t ss, Bytes* d, std::ptrdiff_t ds
     }
 }
 
-template <int PS> inline constexpr int kBlock = PS == 1 ? 16 : PS == 2 ? 8 : PS == 4 ? 4 : PS == 8 ? 2 : 1;
+template <int PS>
+inline constexpr int kBlock = PS == 1 ? 16 : PS == 2 ? 8 : PS == 3 || PS == 4 ? 4 : PS == 6 || PS == 8 ? 2 : 1;
 template <int PS, int K> inline constexpr int kSmaller = (PS == 1 && K == 16) ? 8 : (PS == 2 && K == 8) ? 4 : 1;
 
 // Transposes a w x h source region into the h x w destination: whole K x K
