@@ -35,13 +35,16 @@ const Members<Pvx32f> k32f{{pvxiTranspose_32f_C1R, pvxiTranspose_32f_C3R, pvxiTr
 
 const int kChannels[3] = {1, 3, 4};
 
-// Sides around every block size (2, 4, 8, 16), and random sides that cross
-// the tiles (16 to 256 pixels, by pixel size) in both directions.
-std::vector<Shape> TransposeShapes(Rng& rng, int count)
+// Sides around every block size (2, 4, 8, 16), random sides, and two shapes
+// that cross the tiles (rows of about 1 kB) in both directions.
+std::vector<Shape> TransposeShapes(Rng& rng, int count, int pixelBytes)
 {
+    const int tile = 1024 / pixelBytes;
     const int sides[] = {1, 2, 3, 4, 5, 7, 8, 9, 15, 16, 17, 31, 32, 33, 63, 64, 65, 67};
     std::vector<Shape> out;
     for (int s : sides) out.push_back({s, sides[RandInt(rng, 0, 17)]});
+    out.push_back({2 * tile + RandInt(rng, 1, 9), tile + RandInt(rng, 1, 9)});
+    out.push_back({tile + RandInt(rng, 1, 9), 2 * tile + RandInt(rng, 1, 9)});
     while (static_cast<int>(out.size()) < count) {
         int w = RandInt(rng, 0, 2) ? RandInt(rng, 1, 560) : sides[RandInt(rng, 0, 17)];
         int h = RandInt(rng, 0, 2) ? RandInt(rng, 1, 280) : sides[RandInt(rng, 0, 17)];
@@ -56,7 +59,7 @@ void EveryMember(const Members<T>& m, const char* type, std::uint64_t seed)
     for (int li = 0; li < 3; ++li) {
         int ch = kChannels[li];
         Rng rng = MakeRng(seed + li);
-        for (Shape s : TransposeShapes(rng, 40)) {
+        for (Shape s : TransposeShapes(rng, 40, static_cast<int>(sizeof(T)) * ch)) {
             SCOPED_TRACE(::testing::Message() << "Transpose_" << type << "_C" << ch << "R seed " << seed + li
                                               << " width " << s.width << " height " << s.height);
             GuardedImage src = MakeImage<T>(s.width, s.height, ch, rng);
