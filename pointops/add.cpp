@@ -10,9 +10,9 @@ using namespace simd;
 
 // a + b. Unsigned 8u sums and their rounding stay within 16-bit lanes; at
 // scale factor 0 the saturating add is the whole rule. At scale factor 1 the
-// unsigned types take the rounding-up average and step back to the even
-// neighbour where the sum was odd and the average is odd: 5 operations a
-// register instead of 16, which keeps the 8u halving at memory speed.
+// unsigned types take the rounding-up average and, where the sum was odd,
+// clear its lowest bit: an odd average steps back to its even neighbour and
+// an even one is left as it is. 4 operations a register instead of 16.
 struct AddX : ExactBase {
     static constexpr bool kFits16 = true;
     static Wide Exact(Wide a, Wide b) { return a + b; }
@@ -31,13 +31,8 @@ struct AddX : ExactBase {
         requires(!std::is_same_v<U, Pvx16s>)
     static VI Half(VI a, VI b)
     {
-        if constexpr (std::is_same_v<U, Pvx8u>) {
-            VI avg = AvgU8(a, b);
-            return SubI8(avg, And(And(Xor(a, b), avg), SplatU8(1)));
-        } else {
-            VI avg = AvgU16(a, b);
-            return SubI16(avg, And(And(Xor(a, b), avg), SplatU16(1)));
-        }
+        if constexpr (std::is_same_v<U, Pvx8u>) return AndNot(And(Xor(a, b), SplatU8(1)), AvgU8(a, b));
+        else return AndNot(And(Xor(a, b), SplatU16(1)), AvgU16(a, b));
     }
 };
 
