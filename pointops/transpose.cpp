@@ -204,15 +204,16 @@ void TransposeRegion(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdi
     }
 }
 
-// Tile side in pixels: rows of 1 kB, a multiple of the block side. A block
-// column of a tile writes its destination rows as runs of 1 kB that the
-// prefetchers run ahead on, while the source lines it reads (one a tile row,
-// 64 kB at most) stay in the second level cache for the next block columns.
-// Against rows of 256 bytes, 1080p frames measured 1.1 to 1.3 times faster
-// with 3-, 4- and 6-byte pixels and the same with the others; 8u tiles of
-// 1536 x 1536 measured 1.5 times slower on 4K frames, and 8u tiles of 64 x 64,
-// which fit the first level, 2 to 3 times slower.
-template <int PS> inline constexpr int kTile = std::max(kBlock<PS>, 1024 / PS / kBlock<PS> * kBlock<PS>);
+// Tile side in pixels: rows of 256 bytes (1 kB for the three-channel sizes
+// of 3 and 6 bytes), a multiple of the block side. Each tile row is then at
+// least four lines that the prefetchers can run ahead on, and a tile of
+// source and destination stays in the second level cache. 8u tiles of
+// 64 x 64, which fit the first level, measured 2 to 3 times slower on 4K
+// frames. Rows of 1 kB made the 3- and 6-byte pixels 1.1 to 1.4 times faster
+// on 720p, 1080p, 1500 x 1400 and 4K frames, but the other sizes up to 1.8
+// times slower on some shapes (32f C4 at 1280 x 720, 8u C1 at 1024 x 1024).
+template <int PS>
+inline constexpr int kTile = std::max(kBlock<PS>, (PS == 3 || PS == 6 ? 1024 : 256) / PS / kBlock<PS> * kBlock<PS>);
 
 // Tiles along bands of source rows: reading the source in order measured
 // about 1.5 times faster on 4K frames than bands of source columns.

@@ -36,7 +36,7 @@ const Members<Pvx32f> k32f{{pvxiTranspose_32f_C1R, pvxiTranspose_32f_C3R, pvxiTr
 const int kChannels[3] = {1, 3, 4};
 
 // Sides around every block size (2, 4, 8, 16), random sides, and two shapes
-// that cross the tiles (rows of about 1 kB) in both directions.
+// that cross the tiles (rows of 1 kB at most) in both directions.
 std::vector<Shape> TransposeShapes(Rng& rng, int count, int pixelBytes)
 {
     const int tile = 1024 / pixelBytes;
