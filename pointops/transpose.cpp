@@ -206,12 +206,14 @@ void TransposeRegion(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdi
 
 // Tile side in pixels: rows of 256 bytes (1 kB for the three-channel sizes
 // of 3 and 6 bytes), a multiple of the block side. Each tile row is then at
-// least four lines that the prefetchers can run ahead on, and a tile of
-// source and destination stays in the second level cache. 8u tiles of
-// 64 x 64, which fit the first level, measured 2 to 3 times slower on 4K
-// frames. Rows of 1 kB made the 3- and 6-byte pixels 1.1 to 1.4 times faster
-// on 720p, 1080p, 1500 x 1400 and 4K frames, but the other sizes up to 1.8
-// times slower on some shapes (32f C4 at 1280 x 720, 8u C1 at 1024 x 1024).
+// least four lines that the prefetchers can run ahead on. With 256-byte rows
+// a tile of source and destination (128 kB at most) stays in the second
+// level cache; 8u tiles of 64 x 64, which fit the first level, measured 2 to
+// 3 times slower on 4K frames. The 1 kB tiles of the 3- and 6-byte pixels
+// (up to 700 kB together) do not fit, yet measured 1.1 to 1.4 times faster
+// than 256-byte ones on 720p, 1080p, 1500 x 1400 and 4K frames; for the other
+// sizes 1 kB rows were up to 1.8 times slower on some shapes (32f C4 at
+// 1280 x 720, 8u C1 at 1024 x 1024).
 template <int PS>
 inline constexpr int kTile = std::max(kBlock<PS>, (PS == 3 || PS == 6 ? 1024 : 256) / PS / kBlock<PS> * kBlock<PS>);
 
