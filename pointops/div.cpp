@@ -173,13 +173,18 @@ inline VF OverZero(VF n)
     return OrF(r, AndNotF(OrF(gt, lt), AsFloat(SplatU32(0x7FC00000u))));
 }
 
-// n / d from the reciprocal estimate refined to second order, in this order.
+// The second-order step q + (e q + q) e, in this order, from q = n r and
+// e = 1 - d r with r the reciprocal estimate of d.
+inline VF Refine(VF q, VF e)
+{
+    return AddF(q, MulF(AddF(MulF(e, q), q), e));
+}
+
+// n / d from the reciprocal estimate refined to second order.
 inline VF RefinedQuot(VF n, VF d)
 {
     VF r = RcpF(d);
-    VF q = MulF(n, r);
-    VF e = SubF(SplatF(1.0f), MulF(d, r));
-    return AddF(q, MulF(AddF(MulF(e, q), q), e));
+    return Refine(MulF(n, r), SubF(SplatF(1.0f), MulF(d, r)));
 }
 
 // Div_32f: one register is one group of four (AC4: one pixel).
@@ -218,7 +223,7 @@ struct Div32fOp {
         }
         VF sum = AddF(AddF(e[0], e[1]), AddF(e[2], e[3]));
         if (__builtin_expect(MaskF(OrderedF(sum)) == 0xF, 1)) {
-            for (int k = 0; k < 4; ++k) out[k] = AsInt(AddF(q[k], MulF(AddF(MulF(e[k], q[k]), q[k]), e[k])));
+            for (int k = 0; k < 4; ++k) out[k] = AsInt(Refine(q[k], e[k]));
         } else {
             for (int k = 0; k < 4; ++k) out[k] = Vec(a[k], b[k]);
         }

@@ -242,6 +242,7 @@ TEST(MoveStreaming, SwapChannelsLargeRegions)
     SmallCache cache(kCache);
     ASSERT_EQ(pvxiSwapChannels_8u_C3R(img.ptr<Pvx8u>(), img.step(), img.ptr<Pvx8u>(), img.step(), {401, 337}, order),
               pvxStsNoErr);
+    EXPECT_EQ(gCacheQueries.load(), 0);
     EXPECT_TRUE(RegionEquals(img, want.Packed<Pvx8u>()));
 }
 
