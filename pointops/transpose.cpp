@@ -9,7 +9,8 @@
 // Kernels work on bytes, templated by pixel size, so every type and channel
 // count of one pixel size shares them. Whole blocks are transposed in vector
 // registers (16 x 16 and 8 x 8 bytes, 8 x 8 and 4 x 4 16-bit, 4 x 4 32-bit,
-// 2 x 2 64-bit, and 4 x 4 and 2 x 2 of the three-channel pixels), walked in
+// 2 x 2 64-bit, and 4 x 4 and 2 x 2 of the three-channel pixels; 12-byte
+// pixels move one at a time with single 16-byte stores), walked in
 // cache-sized tiles. Regions of more than 256 kB that are at least as large
 // as the largest cache are written through a tile buffer with non-temporal
 // stores.
@@ -156,6 +157,28 @@ inline void Block48u2(const Bytes* s, std::ptrdiff_t ss, Bytes* d, std::ptrdiff_
     Store12(d + ds, ShuffleBytes(InterleaveHi64(r0, r1), pack));
 }
 
+// 12-byte pixels, one column of the region at a time: one 16-byte store a
+// pixel. The 4 bytes past a stored pixel belong to the next pixel of its
+// destination row, which the walk down the column writes next; the last row
+// stores exactly 12 bytes. kWide: 16-byte loads as well, whose last 4 bytes
+// belong to the next pixel of the source row (the last column loads exactly
+// 12). So nothing outside the region is read or written, and an in-place
+// exchange keeps off the tile beside it. Against moves of 8 and 4 bytes a
+// pixel this measured 1.1 to 1.5 times faster on regions from 64 x 64 to
+// 1080p. The streamed 4K frames, whose source comes from memory, ran 1.1
+// times slower with the wide loads (three loads in sixteen then span two
+// lines instead of one), so the streamed path loads exactly 12 bytes.
+template <bool kWide>
+inline void Region96(const Bytes* s, std::ptrdiff_t ss, Bytes* d, std::ptrdiff_t ds, int w, int h)
+{
+    for (int x = 0; x < w; ++x, s += 12, d += ds) {
+        int y = 0;
+        if (x + 1 < w)
+            for (; y + 1 < h; ++y) StoreU(d + y * 12, kWide ? LoadU(s + ss * y) : Load12(s + ss * y));
+        for (; y < h; ++y) Store12(d + y * 12, Load12(s + ss * y));
+    }
+}
+
 // 2 x 2 64-bit pixels.
 inline void Block64u2(const Bytes* s, std::ptrdiff_t ss, Bytes* d, std::ptrdiff_t ds)
 {
@@ -190,17 +213,22 @@ template <int PS, int K> inline constexpr int kSmaller = (PS == 1 && K == 16) ? 
 
 // Transposes a w x h source region into the h x w destination: whole K x K
 // blocks, then the right and bottom strips with the next smaller block.
-template <int PS, int K = kBlock<PS>>
+// kFromMemory: the streamed path, whose source is not in the cache.
+template <int PS, int K = kBlock<PS>, bool kFromMemory = false>
 void TransposeRegion(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdiff_t ds, int w, int h)
 {
     constexpr std::ptrdiff_t ps = PS;
-    int wk = w / K * K, hk = h / K * K;
-    for (int x = 0; x < wk; x += K)
-        for (int y = 0; y < hk; y += K) Block<PS, K>(src + ss * y + x * ps, ss, dst + ds * x + y * ps, ds);
-    if constexpr (K > 1) {
-        constexpr int K2 = kSmaller<PS, K>;
-        if (wk < w) TransposeRegion<PS, K2>(src + wk * ps, ss, dst + ds * wk, ds, w - wk, h);
-        if (hk < h && wk > 0) TransposeRegion<PS, K2>(src + ss * hk, ss, dst + hk * ps, ds, wk, h - hk);
+    if constexpr (PS == 12) {
+        Region96<!kFromMemory>(src, ss, dst, ds, w, h);
+    } else {
+        int wk = w / K * K, hk = h / K * K;
+        for (int x = 0; x < wk; x += K)
+            for (int y = 0; y < hk; y += K) Block<PS, K>(src + ss * y + x * ps, ss, dst + ds * x + y * ps, ds);
+        if constexpr (K > 1) {
+            constexpr int K2 = kSmaller<PS, K>;
+            if (wk < w) TransposeRegion<PS, K2>(src + wk * ps, ss, dst + ds * wk, ds, w - wk, h);
+            if (hk < h && wk > 0) TransposeRegion<PS, K2>(src + ss * hk, ss, dst + hk * ps, ds, wk, h - hk);
+        }
     }
 }
 
@@ -252,7 +280,7 @@ void TransposeStreaming(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::pt
         for (int ty = 0; ty < h; ty += T) {
             int th = std::min(T, h - ty);
             std::ptrdiff_t bs = th * ps;
-            TransposeRegion<PS>(src + ss * ty + tx * ps, ss, buf, bs, tw, th);
+            TransposeRegion<PS, kBlock<PS>, true>(src + ss * ty + tx * ps, ss, buf, bs, tw, th);
             for (int r = 0; r < tw; ++r) StreamBytes(dst + ds * (tx + r) + ty * ps, buf + bs * r, bs);
         }
     }

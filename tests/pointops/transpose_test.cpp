@@ -1,6 +1,7 @@
 // Transpose against a scalar reference: every member, both forms, shapes
 // that cover whole blocks and every kind of leftover strip, steps of 0 and
 // negative steps, check orders and nothing written on error.
+#include <algorithm>
 #include <array>
 
 #include "harness.h"
@@ -90,17 +91,37 @@ TEST(Transpose, EveryMemberAgainstReference)
     EveryMember(k32f, "32f", 140);
 }
 
+// A negative source step reads the source bottom-up. The image ends where its
+// buffer ends, so the row read first is the last in memory: a kernel that
+// reads past the end of a row reaches beyond the buffer (caught under ASan).
+template <class T>
+void BottomUp(TransposeFn<T> fn, int ch, Rng& rng)
+{
+    for (Shape s : {Shape{37, 21}, Shape{1, 5}, Shape{6, 1}, Shape{67, 33}}) {
+        SCOPED_TRACE(::testing::Message() << "C" << ch << " " << sizeof(T) << "-byte elements, width " << s.width
+                                          << " height " << s.height);
+        ShapeOptions o;
+        o.tightEnd = true;
+        GuardedImage src = MakeImage<T>(s.width, s.height, ch, rng, o), dst = MakeImage<T>(s.height, s.width, ch, rng);
+        ASSERT_EQ(fn(src.row<T>(s.height - 1), -src.step(), dst.ptr<T>(), dst.step(), {s.width, s.height}),
+                  pvxStsNoErr);
+        auto in = src.Packed<T>();
+        std::vector<T> flipped(in.size());
+        const std::size_t row = static_cast<std::size_t>(s.width) * ch;
+        for (int y = 0; y < s.height; ++y)
+            std::copy_n(&in[(s.height - 1 - y) * row], row, &flipped[y * row]);
+        EXPECT_TRUE(RegionEquals(dst, RefTranspose(flipped, s.width, s.height, ch)));
+    }
+}
+
 TEST(Transpose, StepsAreUsedAsGiven)
 {
     Rng rng = MakeRng(150);
-    // A negative source step reads the source bottom-up.
-    GuardedImage src = MakeImage<Pvx16u>(37, 21, 1, rng), dst = MakeImage<Pvx16u>(21, 37, 1, rng);
-    ASSERT_EQ(pvxiTranspose_16u_C1R(src.row<Pvx16u>(20), -src.step(), dst.ptr<Pvx16u>(), dst.step(), {37, 21}),
-              pvxStsNoErr);
-    auto in = src.Packed<Pvx16u>();
-    std::vector<Pvx16u> flipped(in.size());
-    for (int y = 0; y < 21; ++y) std::memcpy(&flipped[y * 37], &in[(20 - y) * 37], 37 * 2);
-    EXPECT_TRUE(RegionEquals(dst, RefTranspose(flipped, 37, 21, 1)));
+    for (int li = 0; li < 3; ++li) {
+        BottomUp(k8u.fn[li], kChannels[li], rng);
+        BottomUp(k16u.fn[li], kChannels[li], rng);
+        BottomUp(k32f.fn[li], kChannels[li], rng);
+    }
     // A source step of 0 repeats the first row.
     GuardedImage src0 = MakeImage<Pvx8u>(19, 1, 1, rng), dst0 = MakeImage<Pvx8u>(18, 19, 1, rng);
     ASSERT_EQ(pvxiTranspose_8u_C1R(src0.ptr<Pvx8u>(), 0, dst0.ptr<Pvx8u>(), dst0.step(), {19, 18}), pvxStsNoErr);
