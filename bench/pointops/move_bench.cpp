@@ -1,5 +1,6 @@
 // Channel and pixel movement against OpenCV: SwapChannels_8u_C3R {2, 1, 0}
-// against cvtColor BGR2RGB, Transpose_8u_C1R against transpose, and
+// against cvtColor BGR2RGB, Transpose_8u_C1R, _8u_C3R and _32f_C3R against
+// transpose, and
 // Mirror_8u_C4R flips 0 and 1 against flip; memref copies the same bytes.
 #include <opencv2/core.hpp>
 #include <opencv2/imgproc.hpp>
@@ -62,6 +63,25 @@ PVX_BENCH_CASES(MoveCases)
             c.peer = [b] { cv::transpose(b->src, b->ref); };
             c.memref = [b, px] { std::memcpy(b->dst.data, b->src.data, px); };
             c.agree = [c, b] { c.pvx(); c.peer(); return Same(*b); };
+            Register(c);
+        }
+        // Three-channel pixels of 3 and 12 bytes, the sizes with kernels of
+        // their own.
+        for (int type : {CV_8UC3, CV_32FC3}) {
+            auto b = MakeBufs(f.height, f.width, f.width, f.height, type);
+            const bool is8u = type == CV_8UC3;
+            const std::int64_t pixelBytes = is8u ? 3 : 12;
+            Case c;
+            c.name = std::string(is8u ? "Transpose_8u_C3R/" : "Transpose_32f_C3R/") + f.label;
+            c.bytes = px * pixelBytes * 2;
+            c.pvx = [b, roi, is8u] {
+                if (is8u) pvxiTranspose_8u_C3R(b->src.data, Step(b->src), b->dst.data, Step(b->dst), roi);
+                else
+                    pvxiTranspose_32f_C3R(b->src.ptr<Pvx32f>(), Step(b->src), b->dst.ptr<Pvx32f>(), Step(b->dst), roi);
+            };
+            c.peer = [b] { cv::transpose(b->src, b->ref); };
+            c.memref = [b, px, pixelBytes] { std::memcpy(b->dst.data, b->src.data, px * pixelBytes); };
+            c.agree = [c, b] { c.pvx(); c.peer(); return std::memcmp(b->dst.data, b->ref.data, b->dst.total() * b->dst.elemSize()) == 0; };
             Register(c);
         }
         for (int flip : {0, 1}) {
