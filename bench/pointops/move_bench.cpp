@@ -1,7 +1,7 @@
 // Channel and pixel movement against OpenCV: SwapChannels_8u_C3R {2, 1, 0}
 // against cvtColor BGR2RGB, Transpose_8u_C1R, _8u_C3R and _32f_C3R against
-// transpose, and
-// Mirror_8u_C4R flips 0 and 1 against flip; memref copies the same bytes.
+// transpose, and Mirror_8u_C4R flips 0 and 1 against flip; memref copies the
+// same bytes.
 #include <opencv2/core.hpp>
 #include <opencv2/imgproc.hpp>
 
@@ -81,7 +81,11 @@ PVX_BENCH_CASES(MoveCases)
             };
             c.peer = [b] { cv::transpose(b->src, b->ref); };
             c.memref = [b, px, pixelBytes] { std::memcpy(b->dst.data, b->src.data, px * pixelBytes); };
-            c.agree = [c, b] { c.pvx(); c.peer(); return std::memcmp(b->dst.data, b->ref.data, b->dst.total() * b->dst.elemSize()) == 0; };
+            c.agree = [c, b] {
+                c.pvx();
+                c.peer();
+                return std::memcmp(b->dst.data, b->ref.data, b->dst.total() * b->dst.elemSize()) == 0;
+            };
             Register(c);
         }
         for (int flip : {0, 1}) {
