@@ -40,6 +40,13 @@ inline void StoreAF(float* p, VF v) { _mm_store_ps(p, v); }
 // Aligned or unaligned access chosen once per row by the caller.
 template <bool A> inline VI Load(const void* p) { if constexpr (A) return LoadA(p); else return LoadU(p); }
 template <bool A> inline void Store(void* p, VI v) { if constexpr (A) StoreA(p, v); else StoreU(p, v); }
+// The same, or a streamed (non-temporal) store when kNt, which needs an
+// aligned address.
+template <bool A, bool kNt> inline void Store(void* p, VI v)
+{
+    if constexpr (kNt) StoreNt(p, v);
+    else Store<A>(p, v);
+}
 
 // ---- constants ----
 inline VI Zero() { return _mm_setzero_si128(); }

@@ -401,10 +401,6 @@ void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const t
     using P = Pattern<typename Op::Unit, T, L>;
     constexpr bool kAlpha = kKeepsAlpha<L>;
     static_assert(!kNt || (A && !kAlpha));
-    auto put = [](typename Op::Unit* p, VI v) {
-        if constexpr (kNt) StoreNt(p, v);
-        else Store<A>(p, v);
-    };
     std::ptrdiff_t i = 0;
     if constexpr (Op::kHasVector) {
         // Local copies: the stores below may alias anything reached through a
@@ -428,7 +424,7 @@ void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const t
                 o.Vec4(va, vb, v);
                 for (int r = 0; r < 4; ++r) {
                     if constexpr (kAlpha) v[r] = SelectBytes(v[r], Load<A>(d + i + r * P::kLanes), alpha[0]);
-                    put(d + i + r * P::kLanes, v[r]);
+                    Store<A, kNt>(d + i + r * P::kLanes, v[r]);
                 }
             }
         }
@@ -444,7 +440,7 @@ void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const t
                 else if constexpr (K == Src2::kConst) v = o.Vec(va, cst[r]);
                 else v = o.Vec(va);
                 if constexpr (kAlpha) v = SelectBytes(v, Load<A>(d + j), alpha[r]);
-                put(d + j, v);
+                Store<A, kNt>(d + j, v);
             }
         }
     }

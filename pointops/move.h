@@ -286,8 +286,7 @@ template <class M, bool kConst, bool kStream>
             for (int q = 0; q < 4; ++q) v[q] = ShuffleBytes(v[q], LoadA(Q.ungroup));
         for (int o = 0; o < 4; ++o) {
             Byte* d = M::kOutPlanar ? out[o] + x * M::kS : out[0] + x * M::kOutPix + 16 * o;
-            if constexpr (kStream) StoreNt(d, v[o]);
-            else StoreU(d, v[o]);
+            Store<false, kStream>(d, v[o]);
         }
         return;
     }
@@ -312,8 +311,7 @@ template <class M, bool kConst, bool kStream>
                 if (T.used[o][q]) r = Or(r, ShuffleBytes(v[q], LoadA(T.idx[o][q])));
         }
         if (T.keeps[o]) r = SelectBytes(r, LoadU(d), LoadA(T.keep[o]));
-        if constexpr (kStream) StoreNt(d, r);
-        else StoreU(d, r);
+        Store<false, kStream>(d, r);
     }
 }
 
@@ -488,10 +486,7 @@ void FillRow(Byte* d, std::ptrdiff_t n, const FillPattern& p)
     std::ptrdiff_t i = static_cast<std::ptrdiff_t>((0 - reinterpret_cast<std::uintptr_t>(d)) & 15);
     int ph = static_cast<int>(i % 48);
     VI v0 = LoadU(b + ph), v1 = LoadU(b + (ph + 16) % 48), v2 = LoadU(b + (ph + 32) % 48);
-    auto store = [d](std::ptrdiff_t at, VI v) {
-        if constexpr (kNt) StoreNt(d + at, v);
-        else StoreA(d + at, v);
-    };
+    auto store = [d](std::ptrdiff_t at, VI v) { Store<true, kNt>(d + at, v); };
     for (; i + 48 <= n; i += 48) {
         store(i, v0);
         store(i + 16, v1);

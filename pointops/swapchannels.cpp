@@ -106,10 +106,7 @@ void SwapRow(const std::uint8_t* src, std::uint8_t* dst, std::ptrdiff_t width, c
         ShuffleBlock<Geo>(in, out, plan.shuffle);
         if constexpr (kKeepAny)
             for (int k = 0; k < Cout; ++k) out[k] = SelectBytes(out[k], Load<A>(d + 16 * k), plan.keep[k]);
-        for (int k = 0; k < Cout; ++k) {
-            if constexpr (kNt) StoreNt(d + 16 * k, out[k]);
-            else Store<A>(d + 16 * k, out[k]);
-        }
+        for (int k = 0; k < Cout; ++k) Store<A, kNt>(d + 16 * k, out[k]);
     }
     for (; x < width; ++x) {
         std::uint8_t px[4 * E];
