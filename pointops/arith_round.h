@@ -42,8 +42,8 @@ inline Wide RoundQuot(Wide num, Wide den, int sf, Rnd r)
         UWide rem = m % d;
         // Shift the scale into the quotient 32 bits at a time; once the
         // quotient reaches the saturation bound, more bits change nothing.
-        for (int s = -sf; s > 0 && q < sat;) {
-            int k = s < 32 ? s : 32;
+        for (std::int64_t s = -static_cast<std::int64_t>(sf); s > 0 && q < sat;) {  // INT_MIN too
+            int k = s < 32 ? static_cast<int>(s) : 32;
             rem <<= k;
             q = (q << k) + rem / d;
             rem %= d;

@@ -18,7 +18,8 @@
 // relative to v; boundaries that it equals are representable and the
 // correctly rounded division returns them exactly. So a division correctly
 // rounded to p bits decides every rounding like the exact value as long as
-// 2^-p < 1 / (2 |N|) wherever v can be below the saturation point. For 8u
+// 2^-p < 1 / (2 |N|) wherever v can be below the saturation point (division
+// rounded to nearest: the call sets that mode for its duration). For 8u
 // (|N| < 2^16 there) single precision suffices at every scale factor; for
 // 16-bit elements single precision suffices for sf >= -7 (|N| < 2^23) and
 // double precision (|N| < 2^48) serves the rest. Scale factors are capped
@@ -51,6 +52,7 @@
 #include "arith_round.h"
 #include "check.h"
 #include "entry.h"
+#include "fpguard.h"
 #include "layout.h"
 #include "simd.h"
 
@@ -338,6 +340,10 @@ PvxStatus DivRun(const T* a, int aStep, const T* b, int bStep, T* d, int dStep, 
         op.zero = &zero;
         RunRows<T, L, K>(op, a, aStep, b, bStep, d, dStep, roi, value);
     } else {
+        // The exactness argument above needs quotients rounded to nearest:
+        // under a caller's directed rounding, 16u at scale factor -7 missed
+        // the rounding boundary. The caller's mode is restored on return.
+        FpGuard nearest(FpRound::kNearest);
         auto run = [&]<Rnd R>() {
             IntDivOp<T, L, R, kC> op(sf);
             op.zero = &zero;

@@ -1,9 +1,10 @@
 // Div, DivC, Div_Round: every member against an exact wide-integer reference
-// (scale factors -10 to 20, every rounding mode), Div_32f against its
+// (scale factors -10 to 20 and the extremes, every rounding mode), Div_32f against its
 // documented group rule, check orders, zero divisors and constants.
 #include <xmmintrin.h>
 
 #include <bit>
+#include <climits>
 #include <cmath>
 #include <limits>
 
@@ -25,6 +26,10 @@ E RefQuot(Wide num, Wide den, int sf, int mode)
         num = -num;
         den = -den;
     }
+    // |num| < 2^64 and den >= 1: beyond 2^100 every value rounds to 0 or
+    // saturates.
+    if (sf > 100) return E{};
+    if (sf < -100) return num > 0 ? L::max() : num < 0 ? L::min() : E{};
     if (sf >= 0) den <<= sf;
     else num <<= -sf;
     Wide q = num / den, r = num % den;
@@ -106,6 +111,16 @@ T RandomNonZero(Rng& rng)
     return v;
 }
 
+// -10 to 20, and the extremes, where the scale alone decides (a scalar tail
+// must not negate INT_MIN).
+std::vector<int> ScaleFactors()
+{
+    std::vector<int> sfs;
+    for (int sf = -10; sf <= 20; ++sf) sfs.push_back(sf);
+    for (int sf : {-40, 40, INT_MIN, INT_MIN + 1, INT_MAX}) sfs.push_back(sf);
+    return sfs;
+}
+
 TEST(Div, IntegerMembersEveryScaleFactorAndMode)
 {
     std::vector<Member> ms = Members("Div");
@@ -118,9 +133,9 @@ TEST(Div, IntegerMembersEveryScaleFactorAndMode)
             using T = decltype(tag);
             std::vector<int> modes = m.Rounding() ? std::vector<int>{0, 1, 2} : std::vector<int>{1};
             for (int mode : modes)
-                for (int sf = -10; sf <= 20; ++sf) {
+                for (int sf : ScaleFactors()) {
                     std::vector<T> value(4);
-                    ForShapes(m.name, 1000 + sf * 7 + mode, 3, [&](Shape s, Rng& rng) {
+                    ForShapes(m.name, 1000 + (sf % 1000) * 7 + mode, 3, [&](Shape s, Rng& rng) {
                         CheckMember<T>(m, s, rng, sf, mode, value,
                                        [&](T a, T b, int) { return RefDiv<T>(b, a, sf, mode); }, DivStatus<T>);
                     }, 40);
@@ -141,10 +156,10 @@ TEST(DivC, IntegerMembersEveryScaleFactor)
         ForTypeCode(m.type, [&](auto tag) {
             using T = decltype(tag);
             Rng vr = MakeRng(31);
-            for (int sf = -10; sf <= 20; ++sf) {
+            for (int sf : ScaleFactors()) {
                 std::vector<T> value(4);
                 for (auto& v : value) v = RandomNonZero<T>(vr);
-                ForShapes(m.name, 2000 + sf, 3, [&](Shape s, Rng& rng) {
+                ForShapes(m.name, 2000 + sf % 1000, 3, [&](Shape s, Rng& rng) {
                     CheckMember<T>(m, s, rng, sf, 1, value,
                                    [&](T a, T c, int) { return RefDiv<T>(a, c, sf, 1); });
                 }, 40);
@@ -311,6 +326,35 @@ TEST(Div, IntegerZeroDivisorAndExtremeScaleFactors)
     EXPECT_EQ(pvxiDiv_32sc_C1RSfs(dc, 8, nc, 8, qc, 8, {1, 1}, 3), pvxStsDivByZero);
     EXPECT_EQ(qc[0].re, std::numeric_limits<Pvx32s>::min());
     EXPECT_EQ(qc[0].im, std::numeric_limits<Pvx32s>::max());
+}
+
+// The integer rules are exact whatever rounding the caller has set: quotients
+// that lie close to a rounding boundary, under each directed mode, and the
+// caller's mode back after the call.
+TEST(Div, IntegerResultsIgnoreTheCallersRoundingMode)
+{
+    const unsigned saved = _MM_GET_ROUNDING_MODE();
+    for (unsigned mode : {_MM_ROUND_DOWN, _MM_ROUND_UP, _MM_ROUND_TOWARD_ZERO}) {
+        std::vector<Pvx16u> d(16, 271), n(16, 48798), q(16);
+        for (int i = 8; i < 16; ++i) {
+            d[i] = 255;
+            n[i] = 65534;
+        }
+        _MM_SET_ROUNDING_MODE(mode);
+        PvxStatus plain = pvxiDiv_16u_C1RSfs(d.data(), 32, n.data(), 32, q.data(), 32, {16, 1}, -7);
+        std::vector<Pvx16u> even = q;
+        PvxStatus away = pvxiDiv_Round_16u_C1RSfs(d.data(), 32, n.data(), 32, q.data(), 32, {16, 1}, 2, -7);
+        PvxStatus byConst = pvxiDivC_16u_C1RSfs(n.data(), 32, 271, q.data(), 32, {8, 1}, -7);
+        unsigned after = _MM_GET_ROUNDING_MODE();
+        _MM_SET_ROUNDING_MODE(saved);
+        EXPECT_EQ(after, mode);
+        EXPECT_EQ(plain, pvxStsNoErr);
+        EXPECT_EQ(away, pvxStsNoErr);
+        EXPECT_EQ(byConst, pvxStsNoErr);
+        for (int i = 0; i < 16; ++i) EXPECT_EQ(even[i], (RefQuot<Pvx16u>(n[i], d[i], -7, 1))) << mode << " " << i;
+        for (int i = 0; i < 8; ++i) EXPECT_EQ(q[i], (RefQuot<Pvx16u>(48798, 271, -7, 1))) << mode << " " << i;
+        for (int i = 8; i < 16; ++i) EXPECT_EQ(q[i], (RefQuot<Pvx16u>(n[i], d[i], -7, 2))) << mode << " " << i;
+    }
 }
 
 // Every 8u dividend and divisor at every scale factor and rounding mode.
