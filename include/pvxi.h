@@ -817,8 +817,8 @@ PVX_API PvxStatus pvxiSubC_32fc_AC4IR(const Pvx32fc value[3], Pvx32fc* pSrcDst, 
 /* Destination channel i receives source channel dstOrder[i]; entries are checked as unsigned numbers (-60). */
 /* C3R, C3IR: 3 entries 0..2. C4R, C4IR: 4 entries 0..3. AC4R: 3 entries 0..2, destination alpha never written. */
 /* C3C4R: 4 entries 0..3; an entry of 3 leaves that destination channel as it was. C4C3R: 3 entries 0..3. */
-/* pSrc == pDst on C3R, C4R, AC4R works in place on the destination rows (dstStep), whatever srcStep is; */
-/* C3C4R and C4C3R change the pixel size and need regions that do not overlap. */
+/* pSrc == pDst works in place on the destination rows (dstStep), whatever srcStep is; for C3C4R and */
+/* C4C3R each row holds the source pixels from its start and takes the destination pixels there. */
 /* Checks: *R pointers (source, destination, order) -8, sizes -6, a step of 0 -14, entries -60; */
 /* *IR image pointer -8, a step of 0 -14, sizes -6, order pointer -8, entries -60. Negative steps are used as given. */
 PVX_API PvxStatus pvxiSwapChannels_8u_C3R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, const int* dstOrder);

@@ -10,12 +10,17 @@
 //   C4C3R      3 entries, each 0..3
 // Entries are compared as unsigned numbers, so a negative entry is refused
 // like a large one (-60); every entry is checked before any pixel is written.
-// When pSrc equals pDst the C3R, C4R and AC4R forms run in place on the
-// destination rows (dstStep), whatever srcStep is. C3C4R and C4C3R change
-// the pixel size and have no in-place meaning: their regions must not overlap.
+// When pSrc equals pDst every form runs in place on the destination rows
+// (dstStep), whatever srcStep is: each row holds the source pixels from its
+// start and receives the destination pixels there. C4C3R packs four-channel
+// pixels into three in the same buffer, C3C4R spreads three-channel pixels
+// out (the row must then hold the wider pixels); the rest of the row is not
+// written.
 //
 // Kernels work on bytes, templated by element size, so 16s/16u and 32s/32f
 // share them and 32f values move as bit patterns.
+#include <cstring>
+
 #include "check.h"
 #include "entry.h"
 #include "layout.h"
@@ -117,6 +122,25 @@ void SwapRow(const std::uint8_t* src, std::uint8_t* dst, std::ptrdiff_t width, c
     }
 }
 
+// C3C4 on one buffer: the destination pixels are wider than the source
+// pixels, so the row runs from its right end in chunks whose source is first
+// copied aside; a chunk then writes only over its own source and over pixels
+// already done. (C4C3 narrows: left to right, a block never writes over
+// source that is still to be read, so SwapRow serves it as it is.)
+template <int E, int Cin, int Cout>
+void SwapRowWidening(std::uint8_t* row, std::ptrdiff_t width, const SwapPlan<E, Cin, Cout>& plan, const int* ord)
+{
+    constexpr std::ptrdiff_t kChunk = 256;
+    alignas(16) std::uint8_t aside[kChunk * Cin * E];
+    for (std::ptrdiff_t end = width; end > 0;) {
+        std::ptrdiff_t x = end > kChunk ? end - kChunk : 0;
+        std::memcpy(aside, row + x * Cin * E, static_cast<std::size_t>((end - x) * Cin * E));
+        if (plan.anyKeep) SwapRow<E, Cin, Cout, true, false>(aside, row + x * Cout * E, end - x, plan, ord);
+        else SwapRow<E, Cin, Cout, false, false>(aside, row + x * Cout * E, end - x, plan, ord);
+        end = x;
+    }
+}
+
 template <int E, int Cin, int Cout>
 void RunSwap(const std::uint8_t* src, std::ptrdiff_t srcStep, std::uint8_t* dst, std::ptrdiff_t dstStep, PvxiSize roi,
              const int* ord)
@@ -138,7 +162,9 @@ void RunSwap(const std::uint8_t* src, std::ptrdiff_t srcStep, std::uint8_t* dst,
         const std::uint8_t* s = src + srcStep * y;
         std::uint8_t* d = dst + dstStep * y;
         bool aligned = IsAligned(s) && IsAligned(d);
-        if (stream && IsAligned(d)) {
+        if (Cin < Cout && s == d) {
+            SwapRowWidening<E, Cin, Cout>(d, width, plan, ord);
+        } else if (stream && IsAligned(d)) {
             if (aligned) SwapRow<E, Cin, Cout, false, true, true>(s, d, width, plan, ord);
             else SwapRow<E, Cin, Cout, false, false, true>(s, d, width, plan, ord);
         } else if (plan.anyKeep) {
@@ -168,8 +194,8 @@ PvxStatus SwapChannelsBody(const T* pSrc, int srcStep, T* pDst, int dstStep, Pvx
     if (PvxStatus s = CheckRoi(roi)) return s;
     if (PvxStatus s = CheckStepsNonZero({srcStep, dstStep})) return s;
     if (PvxStatus s = CheckOrder<L>(dstOrder)) return s;
-    // Same pointer, same pixel size: in place on the destination rows.
-    if (SwapForm<L>::kIn == SwapForm<L>::kOut && pSrc == pDst) srcStep = dstStep;
+    // Same pointer: in place on the destination rows.
+    if (pSrc == pDst) srcStep = dstStep;
     Swap<T, L>(pSrc, srcStep, pDst, dstStep, roi, dstOrder);
     return pvxStsNoErr;
 }
