@@ -178,6 +178,9 @@ PVX_API PvxStatus pvxiConvert_32f8u_C1R(const Pvx32f* pSrc, int srcStep, Pvx8u* 
 /* ---- Copy ---- */
 /* Channel-pointer forms (C3C1 C4C1 C1C3 C1C4 C3CR C4CR): the pointer addresses the chosen channel. */
 /* AC4 destinations keep their fourth channel; C1C3 C1C4 C3CR C4CR leave the other channels untouched. */
+/* Kept values (AC4 alpha, other channels, pixels masked out) are read and stored back unchanged with */
+/* the written ones, 16 bytes at a time: two calls that write different channels, or different */
+/* masked pixels, of the same rows must not run at the same time. */
 PVX_API PvxStatus pvxiCopy_8u_C1R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
 PVX_API PvxStatus pvxiCopy_8u_C3R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
 PVX_API PvxStatus pvxiCopy_8u_C4R(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
@@ -689,6 +692,9 @@ PVX_API PvxStatus pvxiSet_32s_C3MR(const Pvx32s value[3], Pvx32s* pDst, int dstS
 PVX_API PvxStatus pvxiSet_32s_C4MR(const Pvx32s value[4], Pvx32s* pDst, int dstStep, PvxiSize roiSize, const Pvx8u* pMask, int maskStep);
 PVX_API PvxStatus pvxiSet_32s_AC4MR(const Pvx32s value[3], Pvx32s* pDst, int dstStep, PvxiSize roiSize, const Pvx8u* pMask, int maskStep);
 /* One channel: the destination pointer addresses it; the other channels are left untouched. */
+/* Kept values (AC4 alpha, other channels, pixels masked out) are read and stored back unchanged with */
+/* the written ones, 16 bytes at a time: two calls that write different channels, or different */
+/* masked pixels, of the same rows must not run at the same time. */
 PVX_API PvxStatus pvxiSet_8u_C3CR(Pvx8u value, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
 PVX_API PvxStatus pvxiSet_8u_C4CR(Pvx8u value, Pvx8u* pDst, int dstStep, PvxiSize roiSize);
 PVX_API PvxStatus pvxiSet_16s_C3CR(Pvx16s value, Pvx16s* pDst, int dstStep, PvxiSize roiSize);

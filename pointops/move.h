@@ -12,6 +12,11 @@
 //              expanded to the pixel width;
 //   FillRow    a fill with a replicated pattern whose period divides 48.
 //
+// Kept destination bytes (channel blends, pixels masked out) are loaded and
+// stored back with the bytes written, 16 at a time: their values never
+// change, but two calls that write different channels of the same pixels
+// must not run at once (the family headers say so).
+//
 // Loads and stores are movdqu on every row: on aligned addresses it runs as
 // fast as movdqa (measured on 600 KB and 6 MB fills), so an aligned path per
 // row would double the kernels for nothing. Only the streamed stores need
