@@ -82,7 +82,9 @@ void FillRows(const T* value, Byte* dst, int dstStep, PvxiSize roi)
 }
 
 // Fills that keep some destination bytes (AC4 alpha, the other channels of a
-// CR pixel). They read the destination, so they never stream.
+// CR pixel). They read the destination and store it back blended; regions
+// above the threshold that are at least as large as the largest cache stream
+// those stores like the plain fills.
 template <class M, int C, class T>
 void BlendRows(const T* value, int k, Byte* dst, int dstStep, PvxiSize roi)
 {
@@ -91,6 +93,7 @@ void BlendRows(const T* value, int k, Byte* dst, int dstStep, PvxiSize roi)
     move::PatternVectors<M>(pix.bytes, pat);
     std::ptrdiff_t w = roi.width;
     int rows = roi.height;
+    bool nt = UseNonTemporal(w * M::kOutPix * rows, kNtThresholdSet);
     if (RowsContiguous(w * M::kOutPix, {dstStep})) {
         w *= rows;
         rows = 1;
@@ -98,8 +101,10 @@ void BlendRows(const T* value, int k, Byte* dst, int dstStep, PvxiSize roi)
     Byte* out[1];
     for (int y = 0; y < rows; ++y) {
         out[0] = RowAt(dst, dstStep, y);
-        move::MoveRow<M, true>(nullptr, out, w, pat, pix.bytes);
+        if (nt) move::MoveRow<M, true, true>(nullptr, out, w, pat, pix.bytes);
+        else move::MoveRow<M, true>(nullptr, out, w, pat, pix.bytes);
     }
+    if (nt) StoreFence();
 }
 
 template <class T, Lay L>

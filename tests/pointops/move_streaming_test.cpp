@@ -1,4 +1,4 @@
-// Large regions of Transpose, Mirror, planar copies, channel swaps and
+// Large regions of Transpose, Mirror, planar copies, channel swaps, fills and
 // arithmetic are written with non-temporal stores when they are large against
 // the largest cache; the pixels must be the same as with ordinary stores.
 // Real caches are tens of megabytes, so this file stands in for the core
@@ -244,6 +244,35 @@ TEST(MoveStreaming, SwapChannelsLargeRegions)
               pvxStsNoErr);
     EXPECT_EQ(gCacheQueries.load(), 0);
     EXPECT_TRUE(RegionEquals(img, want.Packed<Pvx8u>()));
+}
+
+// Fills that keep destination channels (AC4 alpha, the other channels of a
+// CR pixel) ask the cache size above 1048576 bytes and stream from there;
+// the kept channels must come through unchanged.
+TEST(MoveStreaming, KeepingFillsLargeRegions)
+{
+    Rng rng = MakeRng(51);
+    for (bool aligned : {true, false}) {
+        SCOPED_TRACE(::testing::Message() << "aligned " << aligned);
+        ShapeOptions o{!aligned, !aligned, false, 0};
+        GuardedImage ac4 = MakeImage<Pvx8u>(601, 457, 4, rng, o);  // 1098628 bytes
+        GuardedImage cr = MakeImage<Pvx16u>(401, 449, 3, rng, o);  // 1080294 bytes
+        GuardedImage wantAc4 = ac4, wantCr = cr;
+        const Pvx8u v[3] = {9, 8, 7};
+        for (int y = 0; y < 457; ++y)
+            for (int x = 0; x < 601; ++x)
+                for (int c = 0; c < 3; ++c) wantAc4.row<Pvx8u>(y)[4 * x + c] = v[c];
+        for (int y = 0; y < 449; ++y)
+            for (int x = 0; x < 401; ++x) wantCr.row<Pvx16u>(y)[3 * x + 1] = 4321;
+        SmallCache cache(kCache);
+        ASSERT_EQ(pvxiSet_8u_AC4R(v, ac4.ptr<Pvx8u>(), ac4.step(), {601, 457}), pvxStsNoErr);
+        EXPECT_GT(gCacheQueries.load(), 0);
+        gCacheQueries = 0;
+        ASSERT_EQ(pvxiSet_16u_C3CR(4321, cr.ptr<Pvx16u>() + 1, cr.step(), {401, 449}), pvxStsNoErr);
+        EXPECT_GT(gCacheQueries.load(), 0);
+        EXPECT_TRUE(RegionEquals(ac4, wantAc4.Packed<Pvx8u>()));
+        EXPECT_TRUE(RegionEquals(cr, wantCr.Packed<Pvx16u>()));
+    }
 }
 
 TEST(MoveStreaming, SmallRegionsDoNotAsk)
