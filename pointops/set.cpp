@@ -135,7 +135,10 @@ PvxStatus SetBody(const T* value, T* pDst, int dstStep, PvxiSize roi)
     return SetArrayBody<T, L>(value, pDst, dstStep, roi);
 }
 
-// Masked fill: the masked-copy kernel with a pattern as its source.
+// Masked fill: the masked-copy kernel with a pattern as its source. It never
+// streams, whatever the size: blocks whose mask is all zero are skipped, and
+// streamed stores of lines written in part cost the memory a read and a
+// write each, far more than the cache they would spare.
 template <class T, Lay L>
 PvxStatus SetMaskArrayBody(const T* value, T* pDst, int dstStep, PvxiSize roi, const Pvx8u* pMask, int maskStep)
 {
