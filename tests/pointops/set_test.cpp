@@ -67,10 +67,12 @@ const Member kMembers[] = {
 #undef SET_ONE
 
 // Random value bytes, sometimes one repeated byte; 4-byte members get NaN
-// bit patterns now and then.
+// bit patterns now and then. Exactly the values the member takes (three for
+// AC4), so that a read beyond them shows under AddressSanitizer.
 std::vector<Pvx8u> RandomValue(const Member& m, Rng& rng)
 {
-    std::vector<Pvx8u> v(4 * m.elemBytes);
+    const int count = !m.array ? 1 : m.kind == Kind::kAlpha ? 3 : m.channels;
+    std::vector<Pvx8u> v(count * m.elemBytes);
     for (auto& b : v) b = static_cast<Pvx8u>(rng());
     if (RandInt(rng, 0, 3) == 0) std::fill(v.begin(), v.end(), v[0]);  // 0, -1, 0x0101...: one repeated byte
     const std::uint32_t nans[] = {0x7f800001u, 0xffc12345u};
