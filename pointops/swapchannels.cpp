@@ -93,7 +93,8 @@ struct SwapPlan {
 // Reorders `width` pixels of Cin channels into Cout channels, 16 / E pixels a
 // step; kept channels are blended back from the destination. Every block is
 // loaded before it is stored, and the scalar tail reads a whole pixel before
-// writing it, so src == dst (same pixel size) works in place. A: both rows
+// writing it, so src == dst works in place when the pixel size stays or
+// shrinks. A: both rows
 // 16-byte aligned; kNt: the destination row is aligned and blocks are
 // streamed (every block starts a multiple of 16 bytes into the row).
 template <int E, int Cin, int Cout, bool kKeepAny, bool A, bool kNt = false>
@@ -161,10 +162,14 @@ void RunSwap(const std::uint8_t* src, std::ptrdiff_t srcStep, std::uint8_t* dst,
     for (int y = 0; y < rows; ++y) {
         const std::uint8_t* s = src + srcStep * y;
         std::uint8_t* d = dst + dstStep * y;
+        if constexpr (Cin < Cout) {
+            if (s == d) {
+                SwapRowWidening<E, Cin, Cout>(d, width, plan, ord);
+                continue;
+            }
+        }
         bool aligned = IsAligned(s) && IsAligned(d);
-        if (Cin < Cout && s == d) {
-            SwapRowWidening<E, Cin, Cout>(d, width, plan, ord);
-        } else if (stream && IsAligned(d)) {
+        if (stream && IsAligned(d)) {
             if (aligned) SwapRow<E, Cin, Cout, false, true, true>(s, d, width, plan, ord);
             else SwapRow<E, Cin, Cout, false, false, true>(s, d, width, plan, ord);
         } else if (plan.anyKeep) {

@@ -48,8 +48,15 @@ const Members<Pvx32s> k32s{{pvxiSwapChannels_32s_C3R, pvxiSwapChannels_32s_C4R, 
 const Members<Pvx32f> k32f{{pvxiSwapChannels_32f_C3R, pvxiSwapChannels_32f_C4R, pvxiSwapChannels_32f_AC4R,
                             pvxiSwapChannels_32f_C3C4R, pvxiSwapChannels_32f_C4C3R}};
 
-// Reference: destination channel c takes source channel order[c]; the alpha
-// of AC4 and the C3C4 channels whose entry is 3 keep the destination's value.
+// Destination channels that keep their value: the alpha of AC4 and the C3C4
+// channels whose entry is 3.
+bool Kept(Form f, const int* order, int c)
+{
+    return c >= Info(f).entries || (f == Form::C3C4 && order[c] == 3);
+}
+
+// Reference: destination channel c takes source channel order[c] unless it
+// is kept.
 template <class T>
 std::vector<T> RefSwap(const std::vector<T>& src, const std::vector<T>& dstBefore, std::size_t pixels, Form f,
                        const int* order)
@@ -57,10 +64,8 @@ std::vector<T> RefSwap(const std::vector<T>& src, const std::vector<T>& dstBefor
     FormInfo fi = Info(f);
     std::vector<T> out = dstBefore;
     for (std::size_t p = 0; p < pixels; ++p) {
-        for (int c = 0; c < fi.out; ++c) {
-            bool keep = c >= fi.entries || (f == Form::C3C4 && order[c] == 3);
-            if (!keep) out[p * fi.out + c] = src[p * fi.in + order[c]];
-        }
+        for (int c = 0; c < fi.out; ++c)
+            if (!Kept(f, order, c)) out[p * fi.out + c] = src[p * fi.in + order[c]];
     }
     return out;
 }
@@ -139,10 +144,9 @@ void SamePointer(const Members<T>& m, const char* type, std::uint64_t seed)
             const std::size_t row = std::size_t(s.width) * wide;
             for (int y = 0; y < s.height; ++y)
                 for (int p = 0; p < s.width; ++p)
-                    for (int c = 0; c < fi.out; ++c) {
-                        bool keep = c >= fi.entries || (f == Form::C3C4 && order[c] == 3);
-                        if (!keep) want[y * row + p * fi.out + c] = before[y * row + p * fi.in + order[c]];
-                    }
+                    for (int c = 0; c < fi.out; ++c)
+                        if (!Kept(f, order.data(), c))
+                            want[y * row + p * fi.out + c] = before[y * row + p * fi.in + order[c]];
             int srcStep = RandInt(rng, 0, 1) ? img.step() : (RandInt(rng, 0, 1) ? -3 : 12345);
             ASSERT_EQ(m.fn[static_cast<int>(f)](img.ptr<T>(), srcStep, img.ptr<T>(), img.step(), {s.width, s.height},
                                                 order.data()),
