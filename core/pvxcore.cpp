@@ -150,8 +150,10 @@ PVX_API const char* pvxGetStatusString(PvxStatus status)
     case pvxStsNoOperation: return "pvxStsNoOperation: warning: nothing to do, nothing written";
     case pvxStsDivByZero: return "pvxStsDivByZero: warning: a divisor was zero; a defined value was written";
     case pvxStsNoIntersection: return "pvxStsNoIntersection: warning: the region does not intersect the source; nothing written";
+    case pvxStsEvenMedianWeight: return "pvxStsEvenMedianWeight: warning: an even centre weight was reduced by one";
     case pvxStsSizeWrn: return "pvxStsSizeWrn: warning: a size was smaller than needed; the result was completed in a reduced form";
     case pvxStsBadArgErr: return "pvxStsBadArgErr: an argument value is outside its accepted set";
+    case pvxStsRangeErr: return "pvxStsRangeErr: bounds or levels are not in ascending order";
     case pvxStsSizeErr: return "pvxStsSizeErr: a width or height is less than 1, or a size is out of range";
     case pvxStsNullPtrErr: return "pvxStsNullPtrErr: a required pointer is null";
     case pvxStsMemAllocErr: return "pvxStsMemAllocErr: a work buffer could not be allocated";
@@ -159,9 +161,11 @@ PVX_API const char* pvxGetStatusString(PvxStatus status)
     case pvxStsOutOfRangeErr: return "pvxStsOutOfRangeErr: an offset or point lies outside the image or the prepared range";
     case pvxStsDataTypeErr: return "pvxStsDataTypeErr: the pixel-type code is not supported";
     case pvxStsScaleRangeErr: return "pvxStsScaleRangeErr: the value range is empty";
+    case pvxStsFftFlagErr: return "pvxStsFftFlagErr: the normalisation flag is not supported";
     case pvxStsStepErr: return "pvxStsStepErr: a step is less than 1 or too small for the row";
     case pvxStsFftOrderErr: return "pvxStsFftOrderErr: an FFT order is out of range";
     case pvxStsContextMatchErr: return "pvxStsContextMatchErr: the spec or state object is not of the expected kind";
+    case pvxStsThresholdErr: return "pvxStsThresholdErr: the upper threshold is below the lower threshold";
     case pvxStsMoment00ZeroErr: return "pvxStsMoment00ZeroErr: the zero-order moment is too small to normalise";
     case pvxStsMirrorFlipErr: return "pvxStsMirrorFlipErr: the flip axis is not 0, 1 or 2";
     case pvxStsInterpolationErr: return "pvxStsInterpolationErr: the interpolation code is not supported";
@@ -175,6 +179,7 @@ PVX_API const char* pvxGetStatusString(PvxStatus status)
     case pvxStsDivisorErr: return "pvxStsDivisorErr: an integer filter divisor is zero";
     case pvxStsNumChannelsErr: return "pvxStsNumChannelsErr: the channel count is not served";
     case pvxStsChannelOrderErr: return "pvxStsChannelOrderErr: a channel-order entry is out of range";
+    case pvxStsZeroMaskValuesErr: return "pvxStsZeroMaskValuesErr: every value of the mask is zero";
     case pvxStsQuadErr: return "pvxStsQuadErr: a quadrangle is degenerate";
     case pvxStsRectErr: return "pvxStsRectErr: a rectangle is degenerate";
     case pvxStsCoeffErr: return "pvxStsCoeffErr: transform coefficients are singular";
@@ -183,8 +188,11 @@ PVX_API const char* pvxGetStatusString(PvxStatus status)
     case pvxStsNotEvenStepErr: return "pvxStsNotEvenStepErr: a step is not a multiple of the element size";
     case pvxStsNoiseValErr: return "pvxStsNoiseValErr: the noise parameter is out of range";
     case pvxStsResizeTooSmallErr: return "pvxStsResizeTooSmallErr: the destination is too small for the resize method";
+    case pvxStsQualityIndexErr: return "pvxStsQualityIndexErr: the quality index is undefined for images this flat";
+    case pvxStsWeightErr: return "pvxStsWeightErr: the centre weight is less than 1";
     case pvxStsRoundModeNotSupportedErr: return "pvxStsRoundModeNotSupportedErr: the rounding mode is not supported";
     case pvxStsBorderErr: return "pvxStsBorderErr: the border type is not served by this function";
+    case pvxStsWarpDirectionErr: return "pvxStsWarpDirectionErr: the warp direction is not 0 or 1";
     case pvxStsOddOffsetErr: return "pvxStsOddOffsetErr: an x offset or width must be even";
     case pvxStsNotSupportedModeErr: return "pvxStsNotSupportedModeErr: a valid combination this library does not serve";
     default: return "unknown status";

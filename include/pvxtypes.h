@@ -43,15 +43,19 @@ typedef int PvxStatus;
 
 enum PvxStatusValue {
     pvxStsNotSupportedModeErr      = -9999, /* valid arguments this library does not serve */
+    pvxStsWarpDirectionErr         = -231,  /* warp direction not 0 or 1 */
     pvxStsOddOffsetErr             = -227,  /* an x offset or width must be even */
     pvxStsBorderErr                = -225,  /* border type not served by this function */
     pvxStsRoundModeNotSupportedErr = -213,  /* rounding mode not 0, 1 or 2, or not served */
+    pvxStsWeightErr                = -211,  /* median centre weight below 1 */
+    pvxStsQualityIndexErr          = -210,  /* quality index undefined for flat images */
     pvxStsResizeTooSmallErr        = -201,  /* destination too small for the resize method */
     pvxStsNoiseValErr              = -125,  /* Wiener noise parameter out of range */
     pvxStsNotEvenStepErr           = -108,  /* step not a multiple of the element size */
     pvxStsHistoNofLevelsErr        = -107,  /* histogram with fewer than 2 levels */
     pvxStsLUTNofLevelsErr          = -106,  /* look-up table with fewer than 2 levels */
     pvxStsChannelOrderErr          = -60,   /* channel-order entry out of range */
+    pvxStsZeroMaskValuesErr        = -59,   /* every mask value is zero */
     pvxStsCoeffErr                 = -58,   /* transform coefficients are singular */
     pvxStsRectErr                  = -57,   /* rectangle is degenerate */
     pvxStsQuadErr                  = -56,   /* quadrangle is degenerate */
@@ -67,7 +71,9 @@ enum PvxStatusValue {
     pvxStsInterpolationErr         = -22,   /* interpolation code not supported */
     pvxStsMirrorFlipErr            = -21,   /* flip axis not 0, 1 or 2 */
     pvxStsMoment00ZeroErr          = -20,   /* zero-order moment too small */
+    pvxStsThresholdErr             = -18,   /* upper threshold below the lower */
     pvxStsContextMatchErr          = -17,   /* spec object of another kind */
+    pvxStsFftFlagErr               = -16,   /* normalisation flag not served */
     pvxStsFftOrderErr              = -15,   /* FFT order out of range */
     pvxStsStepErr                  = -14,   /* step below 1 or too small for the row */
     pvxStsScaleRangeErr            = -13,   /* value range is empty */
@@ -76,12 +82,14 @@ enum PvxStatusValue {
     pvxStsDivByZeroErr             = -10,   /* constant divisor is zero */
     pvxStsMemAllocErr              = -9,    /* work buffer could not be allocated */
     pvxStsNullPtrErr               = -8,    /* a required pointer is null */
+    pvxStsRangeErr                 = -7,    /* bounds or levels out of order */
     pvxStsSizeErr                  = -6,    /* width or height below 1, or size out of range */
     pvxStsBadArgErr                = -5,    /* argument outside its accepted set */
     pvxStsNoErr                    = 0,     /* success */
     pvxStsNoOperation              = 1,     /* warning: nothing to do, nothing written */
     pvxStsDivByZero                = 6,     /* warning: a divisor was zero, defined value written */
     pvxStsNoIntersection           = 29,    /* warning: region outside the source, nothing written */
+    pvxStsEvenMedianWeight         = 39,    /* warning: an even weight was reduced by one */
     pvxStsSizeWrn                  = 48     /* warning: result completed in a reduced form */
 };
 
@@ -125,13 +133,11 @@ typedef enum {
 /* Low four bits: the border kind; bits 4 to 7: the border pixels on that side
  * are already in memory. */
 typedef enum {
-    pvxBorderRepl        = 1,
-    pvxBorderWrap        = 2,
-    pvxBorderMirror      = 3,
-    pvxBorderMirrorR     = 4,
-    pvxBorderConst       = 6,
-    pvxBorderTransp      = 7,
-    pvxBorderInMem       = 8,
+    pvxBorderConst       = 0, /* the caller's border value */
+    pvxBorderRepl        = 1, /* the nearest edge pixel */
+    pvxBorderMirror      = 3, /* reflection about the edge pixel */
+    pvxBorderMirrorR     = 4, /* reflection with the edge pixel repeated */
+    pvxBorderInMem       = 6, /* every pixel read around the region exists */
     pvxBorderInMemTop    = 0x0010,
     pvxBorderInMemBottom = 0x0020,
     pvxBorderInMemLeft   = 0x0040,
@@ -152,9 +158,9 @@ typedef enum {
 } PvxiWarpDirection;
 
 typedef enum {
-    pvxAlgHintNone     = 0,
-    pvxAlgHintFast     = 1,
-    pvxAlgHintAccurate = 2
+    pvxHintDefault  = 0,
+    pvxHintFast     = 1,
+    pvxHintAccurate = 2 /* 32f sums in double precision; any other value is the fast path */
 } PvxAccuracyHint;
 
 typedef enum {

@@ -145,7 +145,9 @@ TEST(Core, StatusStrings)
     EXPECT_STREQ(pvxGetStatusString(pvxStsNullPtrErr), "pvxStsNullPtrErr: a required pointer is null");
     const int all[] = {0, 1, 6, 29, 48, -5, -6, -8, -9, -10, -11, -12, -13, -14, -15, -17, -20, -21, -22, -23, -33,
                        -34, -36, -37, -47, -50, -51, -53, -60, -56, -57, -58, -106, -107, -108, -125, -201, -213,
-                       -225, -227, -9999};
+                       -225, -227, -9999,
+                       // returned by the filter, statistics, warp and transform families
+                       -7, -16, -18, -59, -210, -211, -231, 39};
     for (int s : all) EXPECT_STRNE(pvxGetStatusString(s), "unknown status") << s;
     EXPECT_STREQ(pvxGetStatusString(-4), "unknown status");
 }
