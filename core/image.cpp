@@ -7,7 +7,7 @@ namespace {
 
 // Feature bits 0x10 and 0x20 are recorded once at load. Nothing reads the
 // record and no function behaves differently because of it.
-[[maybe_unused]] const bool kLoadFeatures = ownGetFeature(0x10 | 0x20) != 0;
+[[maybe_unused]] const bool kLoadFeatures = (pvxGetEnabledCpuFeatures() & 0x30) == 0x30;
 
 constexpr PvxVersionRecord MakeVersion(const char* name)
 {
