@@ -76,6 +76,7 @@ struct SfsK {
     int sf = 0;
     simd::VI cnt;             // shift count: sf down, or min(-sf, bits of U) up
     simd::VI one16, half16;   // 16-bit lanes: 1, 2^(sf-1) - 1
+    simd::VI tie16, tieAt16;  // 16-bit lanes, sf 1 to 15: 2^(sf+1) - 1, 2^(sf-1)
     simd::VI one32, half32;   // 32-bit lanes
     simd::VI lo16, hi16;      // shift-up clamps (lo - 1, hi + 1), 16-bit lanes
     simd::VI lo32, hi32;      // 32-bit lanes
@@ -89,7 +90,7 @@ inline SfsK MakeSfsK(int sf, Sf m)
     k.sf = sf;
     k.one16 = _mm_set1_epi16(1);
     k.one32 = _mm_set1_epi32(1);
-    k.half16 = k.half32 = Zero();
+    k.half16 = k.half32 = k.tie16 = k.tieAt16 = Zero();
     k.lo16 = k.hi16 = k.lo32 = k.hi32 = Zero();
     k.cnt = Zero();
     if (m == Sf::kDown) {
@@ -98,6 +99,10 @@ inline SfsK MakeSfsK(int sf, Sf m)
         k.cnt = ShiftCount(s);
         k.half16 = _mm_set1_epi16(static_cast<short>(half & 0xFFFF));
         k.half32 = _mm_set1_epi32(static_cast<int>(half & 0xFFFFFFFF));
+        if (s <= 15) {
+            k.tie16 = _mm_set1_epi16(static_cast<short>((1 << (s + 1)) - 1));
+            k.tieAt16 = _mm_set1_epi16(static_cast<short>(1 << (s - 1)));
+        }
     } else if (m == Sf::kUp) {
         // The result is r * 2^up saturated: clamp r to [lo - 1, hi + 1], where
         // [lo, hi] are the values whose shifted result fits, then shift; the

@@ -37,16 +37,18 @@ struct MulX : ExactBase {
             r[1] = InterleaveHi16(lo, hi);
         }
     }
-    // 16s, sf 1 to 15: the bit that rounds half to even (bit sf of the
-    // product) is a bit of the low 16-bit product, so one multiply-add per
-    // pair gives a * b + 2^(sf-1) - 1 + odd in 32 bits; then shift and pack.
-    // 13 operations a register instead of 21.
+    // 16s, sf 1 to 15: one multiply-add per pair gives a * b + 2^(sf-1) - tie
+    // in 32 bits, where tie marks a product that lies halfway above an even
+    // result (its low sf + 1 bits are 2^(sf-1)); those bits are the low 16-bit
+    // product's. Then shift and pack: 13 operations a register instead of 21,
+    // and the tie test is a compare where a shift would queue with the
+    // interleaves and packs on the shuffle ports.
     template <class U>
         requires std::is_same_v<U, Pvx16s>
     static VI Down(VI a, VI b, const SfsK& k)
     {
-        VI odd = And(SrlI16(MulLoI16(a, b), k.cnt), k.one16);
-        VI add = AddI16(odd, k.half16);
+        VI tie = EqI16(And(MulLoI16(a, b), k.tie16), k.tieAt16);
+        VI add = AddI16(tie, k.tieAt16);
         VI ones = k.one16;
         VI lo = MulAddPairsI16(InterleaveLo16(a, ones), InterleaveLo16(b, add));
         VI hi = MulAddPairsI16(InterleaveHi16(a, ones), InterleaveHi16(b, add));
