@@ -132,6 +132,7 @@ inline VI SrlI16n(VI v, int n) { return _mm_srli_epi16(v, n); }
 inline VI SrlI32n(VI v, int n) { return _mm_srli_epi32(v, n); }
 inline VI SllI16n(VI v, int n) { return _mm_slli_epi16(v, n); }
 inline VI SraI32n(VI v, int n) { return _mm_srai_epi32(v, n); }
+inline VI SllI32n(VI v, int n) { return _mm_slli_epi32(v, n); }
 inline int MaskBytes(VI a) { return _mm_movemask_epi8(a); }
 
 // ---- widening and narrowing ----

@@ -987,8 +987,8 @@ PVX_API PvxStatus pvxiSqrt_32f_C4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize ro
 PVX_API PvxStatus pvxiSqrt_32f_AC4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize roiSize);
 
 /* ---- Exp ---- */
-/* Exp: e^x; integer members: times 2^-scaleFactor, rounded half to even, saturated. 32f: expf of each */
-/* element. Checks pointers (-8), sizes (-6), steps (-14). */
+/* Exp: e^x; integer members: times 2^-scaleFactor, rounded half to even, saturated. 32f: within 1 ulp */
+/* of e^x for every input, whatever rounding the caller set. Checks pointers (-8), sizes (-6), steps (-14). */
 PVX_API PvxStatus pvxiExp_8u_C1RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
 PVX_API PvxStatus pvxiExp_8u_C3RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
 PVX_API PvxStatus pvxiExp_8u_C4RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
@@ -1024,8 +1024,10 @@ PVX_API PvxStatus pvxiExp_32f_AC4IR(Pvx32f* pSrcDst, int srcDstStep, PvxiSize ro
 
 /* ---- Ln ---- */
 /* Ln: the natural logarithm; integer members: times 2^-scaleFactor, rounded half to even, saturated; */
-/* ln 0 gives the type's minimum (0 unsigned), a negative 16s value gives 0. 32f: logf of each element. */
-/* A call that met a 0 returns pvxStsDivByZero (6). Checks pointers (-8), sizes (-6), steps (-14). */
+/* ln 0 gives the type's minimum (0 unsigned), a negative 16s value gives 0. 32f: within 1 ulp of ln x */
+/* for every input, whatever rounding the caller set; NaN for negative values. A call that met a 0 */
+/* (whose logarithm is a pole, as a division by zero) returns pvxStsDivByZero (6). */
+/* Checks pointers (-8), sizes (-6), steps (-14). */
 PVX_API PvxStatus pvxiLn_8u_C1RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
 PVX_API PvxStatus pvxiLn_8u_C3RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);
 PVX_API PvxStatus pvxiLn_8u_C4RSfs(const Pvx8u* pSrc, int srcStep, Pvx8u* pDst, int dstStep, PvxiSize roiSize, int scaleFactor);

@@ -144,11 +144,13 @@ PvxStatus Invoke(const Member& m, const CallArgs<T>& x)
 // Checks one member on one shape against ref(a, b, channel) -> T, where a and b
 // are the pixel elements of the first and second operand (b: src2, or the
 // constant's channel; unused for one image). want is the expected status.
+// rel > 0 compares floats within rel |want| (plus the smallest subnormal).
 // The in-place image starts with the operand that it replaces; AC4 alpha and
 // every guard byte must stay as they were.
 template <class T, class Ref>
 void CheckMember(const Member& m, Shape s, Rng& rng, int sf, int mode, const std::vector<T>& value, Ref ref,
-                 PvxStatus (*status)(const Member&, const std::vector<T>&, const std::vector<T>&, int) = nullptr)
+                 PvxStatus (*status)(const Member&, const std::vector<T>&, const std::vector<T>&, int) = nullptr,
+                 double rel = 0)
 {
     using E = ElemT<T>;
     constexpr int kP = Elem<T>::kParts;
@@ -188,7 +190,11 @@ void CheckMember(const Member& m, Shape s, Rng& rng, int sf, int mode, const std
     PvxStatus st = Invoke<T>(m, x);
     PvxStatus wantSt = status ? status(m, ua, ub, C) : pvxStsNoErr;
     EXPECT_EQ(st, wantSt) << m.name << " sf " << sf;
-    EXPECT_TRUE(RegionEquals(*out, want)) << m.name << " sf " << sf << " mode " << mode;
+    if (rel > 0) {
+        EXPECT_TRUE(RegionNear(*out, want, rel, 0x1p-149)) << m.name;
+    } else {
+        EXPECT_TRUE(RegionEquals(*out, want)) << m.name << " sf " << sf << " mode " << mode;
+    }
     if (out != &a) {
         EXPECT_TRUE(a.Unchanged()) << m.name;
     }
