@@ -5,6 +5,7 @@
 #include <cpuid.h>
 #include <unistd.h>
 
+#include <atomic>
 #include <cstdlib>
 
 namespace {
@@ -103,8 +104,33 @@ long long DetectMaxCache()
     return best;
 }
 
-const Pvx64u kFeatures = DetectFeatures();
-const long long kMaxCache = DetectMaxCache();
+// Both answers are found on first use, not by a static initializer: another
+// library's or the program's initializers may ask first (in a static link the
+// order between them is unspecified). Threads that race compute the same
+// value; the atomics need neither a lock nor the C++ runtime's guards.
+constexpr Pvx64u kKnown = 1ull << 63;  // no feature bit
+std::atomic<Pvx64u> gFeatures{0};
+std::atomic<long long> gMaxCache{-1};
+
+Pvx64u Features()
+{
+    Pvx64u f = gFeatures.load(std::memory_order_relaxed);
+    if (!(f & kKnown)) {
+        f = DetectFeatures() | kKnown;
+        gFeatures.store(f, std::memory_order_relaxed);
+    }
+    return f & ~kKnown;
+}
+
+long long MaxCache()
+{
+    long long c = gMaxCache.load(std::memory_order_relaxed);
+    if (c < 0) {
+        c = DetectMaxCache();
+        gMaxCache.store(c, std::memory_order_relaxed);
+    }
+    return c;
+}
 
 }  // namespace
 
@@ -125,22 +151,23 @@ PVX_API void pvxFree(void* ptr)
 PVX_API PvxStatus pvxGetMaxCacheSizeB(int* pSizeByte)
 {
     if (!pSizeByte) return pvxStsNullPtrErr;
-    if (kMaxCache <= 0 || kMaxCache > 0x7fffffff) {
+    long long cache = MaxCache();
+    if (cache <= 0 || cache > 0x7fffffff) {
         *pSizeByte = 0;
         return pvxStsNotSupportedModeErr;
     }
-    *pSizeByte = static_cast<int>(kMaxCache);
+    *pSizeByte = static_cast<int>(cache);
     return pvxStsNoErr;
 }
 
 PVX_API Pvx64u pvxGetEnabledCpuFeatures(void)
 {
-    return kFeatures;
+    return Features();
 }
 
 PVX_API int ownGetFeature(Pvx64u featureMask)
 {
-    return (kFeatures & featureMask) == featureMask;
+    return (Features() & featureMask) == featureMask;
 }
 
 PVX_API const char* pvxGetStatusString(PvxStatus status)
