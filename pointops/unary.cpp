@@ -356,6 +356,7 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
             // boundary (a half-integer) the vector is done in double precision.
             constexpr int kN = 4 / sizeof(T);
             auto abs = [](VF v) { return AndNotF(SplatF(-0.0f), v); };
+            const VF kAbove = SplatF(static_cast<float>(std::numeric_limits<T>::max()) + 1.0f);
             VI w[kN], r[kN];
             Widen32<T>(a, w);
             VF zero = ZeroF();
@@ -363,7 +364,8 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
                 VF x = CvtI32F(w[i]);
                 VF y = MulF(LnF(x), scale);
                 VF gap = abs(SubF(SplatF(0.5f), abs(SubF(y, RoundEvenF(y)))));
-                int near = MaskF(GeF(MulF(abs(y), SplatF(0x1p-22f)), gap));
+                // (y at or above the type's maximum + 1 saturates however it rounds)
+                int near = MaskF(AndF(GeF(MulF(abs(y), SplatF(0x1p-22f)), gap), LtF(y, kAbove)));
                 zero = OrF(zero, EqF(x, ZeroF()));  // each w[i] holds whole pixels
                 r[i] = SatI32<T, Rnd::kEven>(y);
                 if (near) [[unlikely]]
