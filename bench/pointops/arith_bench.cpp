@@ -121,6 +121,32 @@ PVX_BENCH_CASES(ArithCases)
         Finish(c, b, 0);
     }
     {
+        // MulScale truncates a * b / 255 and the peer rounds it: within one.
+        auto b = MakeBufs(f, CV_8U, 0, 256, px * 3);
+        Case c;
+        c.name = "MulScale_8u_C1R" + tag;
+        c.bytes = px * 3;
+        c.pvx = [b, roi] {
+            pvxiMulScale_8u_C1R(b->a.ptr(), Step(b->a), b->b.ptr(), Step(b->b), b->dst.ptr(), Step(b->dst), roi);
+        };
+        c.peer = [b] { cv::multiply(b->a, b->b, b->ref, 1.0 / 255); };
+        Finish(c, b, 1);
+    }
+    {
+        // Quotients rounded half to even; divisors from 1 (the peer writes 0
+        // for a zero divisor). The peer divides in single precision: within one.
+        auto b = MakeBufs(f, CV_8U, 1, 256, px * 3);
+        Case c;
+        c.name = "Div_Round_8u_C1RSfs_even" + tag;
+        c.bytes = px * 3;
+        c.pvx = [b, roi] {
+            pvxiDiv_Round_8u_C1RSfs(b->a.ptr(), Step(b->a), b->b.ptr(), Step(b->b), b->dst.ptr(), Step(b->dst), roi,
+                                    pvxRndNearestEven, 0);
+        };
+        c.peer = [b] { cv::divide(b->b, b->a, b->ref); };
+        Finish(c, b, 1);
+    }
+    {
         auto b = MakeBufs(f, CV_32FC2, -1000, 1000, px * 16);
         Case c;
         c.name = "AddC_32fc_C1R" + tag;

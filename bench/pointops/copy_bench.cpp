@@ -1,6 +1,8 @@
-// Copy and Set against OpenCV's copyTo, setTo, split and merge, with
-// memcpy/memset of the same bytes as the bandwidth reference.
+// Copy, Set and Dup against OpenCV's copyTo, setTo, split, merge and
+// cvtColor(GRAY2BGR), with memcpy/memset of the same bytes as the bandwidth
+// reference.
 #include <opencv2/core.hpp>
+#include <opencv2/imgproc.hpp>
 
 #include <cstring>
 #include <memory>
@@ -142,6 +144,32 @@ void MergeCase(const Frame& f)
     Register(c);
 }
 
+// One gray plane into the three channels of a color image.
+void DupCase(const Frame& f)
+{
+    auto b = MakeBufs(f, CV_8UC1);
+    auto d = std::make_shared<Bufs>();
+    d->dst.create(f.height, f.width, CV_8UC3);
+    d->ref.create(f.height, f.width, CV_8UC3);
+    d->a.assign(static_cast<std::size_t>(f.width) * f.height * 4, 1);
+    d->b.assign(d->a.size(), 2);
+    PvxiSize roi{f.width, f.height};
+    Case c;
+    c.name = std::string("Dup_8u_C1C3R/") + f.label;
+    c.bytes = static_cast<std::int64_t>(f.width) * f.height * 4;
+    c.pvx = [b, d, roi] {
+        pvxiDup_8u_C1C3R(b->src.ptr(), static_cast<int>(b->src.step), d->dst.ptr(), static_cast<int>(d->dst.step), roi);
+    };
+    c.peer = [b, d] { cv::cvtColor(b->src, d->ref, cv::COLOR_GRAY2BGR); };
+    c.memref = [d] { std::memcpy(d->a.data(), d->b.data(), d->a.size()); };
+    c.agree = [c, d] {
+        c.pvx();
+        c.peer();
+        return Same(d->dst, d->ref);
+    };
+    Register(c);
+}
+
 PVX_BENCH_CASES(CopyCases)
 {
     for (const Frame& f : kFrames) {
@@ -150,6 +178,7 @@ PVX_BENCH_CASES(CopyCases)
         SetCase(f);
         SplitCase(f);
         MergeCase(f);
+        DupCase(f);
     }
 }
 
