@@ -488,7 +488,8 @@ void RunRows(const Op& op, const T* a, int aStep, const T* b, int bStep, T* d, i
     if constexpr (kCanStream) {
         const void* out = d;
         if (op.Vector() && out != a && out != b) {
-            std::int64_t images = K == Src2::kImage ? 3 : 2;
+            // an image given as both sources (Sqr, Mul of an image by itself) is read once
+            std::int64_t images = K == Src2::kImage && static_cast<const void*>(a) != b ? 3 : 2;
             nt = StreamWorkingSet(images * rowBytes * rows);
         }
     }
