@@ -119,8 +119,7 @@ struct IntDivOp {
         Widen32<U>(num, n);
         Widen32<U>(den, d);
         if (!wide) {
-            for (int i = 0; i < kN; ++i)
-                r[i] = SatI32<U, R>(DivF(MulF(CvtI32F(n[i]), scaleF), CvtI32F(d[i])));
+            for (int i = 0; i < kN; ++i) r[i] = Sat(DivF(MulF(CvtI32F(n[i]), scaleF), CvtI32F(d[i])));
         } else {
             for (int i = 0; i < kN; ++i)
                 r[i] = SatI32<U, R>(DivD(MulD(CvtLoI32D(n[i]), scaleD), CvtLoI32D(d[i])),
@@ -150,6 +149,23 @@ struct IntDivOp {
     }
 
 private:
+    // A single-precision quotient to 32-bit lanes, rounded by R and saturated
+    // to U. Unsigned quotients are never negative: capping at the maximum
+    // (+inf included) and converting by the rounding control (nearest for the
+    // call, so half to even) or by truncation does it in two operations; 0 / 0
+    // (NaN) converts to INT_MIN, which the packs take to 0, as they must.
+    static VI Sat(VF q)
+    {
+        constexpr bool kUnsigned = !std::numeric_limits<U>::is_signed;
+        if constexpr (kUnsigned && R == Rnd::kEven) {
+            return CvtF32(MinF(SplatF(static_cast<float>(std::numeric_limits<U>::max())), q));
+        } else if constexpr (kUnsigned && R == Rnd::kZero) {
+            return CvtTruncF32(MinF(SplatF(static_cast<float>(std::numeric_limits<U>::max())), q));
+        } else {
+            return SatI32<U, R>(q);
+        }
+    }
+
     static VI Eq0(VI v)
     {
         if constexpr (sizeof(U) == 1) return EqU8(v, Zero());
