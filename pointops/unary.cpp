@@ -23,8 +23,8 @@
 //     inputs beyond the table's ends repeat its end values. 32f: ExpF below,
 //     within 1 ulp.
 //   Ln: 16-bit: ln x 2^-sf in single precision (LnF below), rounded half to
-//     even; a vector with a value too close to a rounding boundary for that
-//     precision is done again in double precision. 8u: a per-call table of
+//     even; a value too close to a rounding boundary for that precision is
+//     done again in double precision. 8u: a per-call table of
 //     the 256 results in double precision. 32f: LnF, within 1 ulp.
 //     ln 0 counts as a division by zero (a pole), hence the status.
 //   Complement (32s, in place): converts between two's complement and
@@ -352,8 +352,8 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
             return AsInt(LnF(x));
         } else {
             // y = ln x 2^-sf in single precision is within 1 ulp, |y| 2^-23, of
-            // the exact value; where it lies within |y| 2^-22 of a rounding
-            // boundary (a half-integer) the vector is done in double precision.
+            // the exact value; a lane within |y| 2^-22 of a rounding boundary
+            // (a half-integer) is done again in double precision.
             constexpr int kN = 4 / sizeof(T);
             auto abs = [](VF v) { return AndNotF(SplatF(-0.0f), v); };
             const VF kAbove = SplatF(static_cast<float>(std::numeric_limits<T>::max()) + 1.0f);
@@ -433,7 +433,8 @@ PvxStatus UnaryBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize r
     bool met = false;
     Op<T, L> op(scaleFactor);
     op.flag = &met;
-    UnderOwnRounding<Op<T, L>>([&] { RunRows<T, L, Src2::kNone>(op, pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi); });
+    UnderOwnRounding<Op<T, L>>(
+        [&] { RunRows<T, L, Src2::kNone>(op, pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi); });
     return met ? pvxStsDivByZero : pvxStsNoErr;
 }
 

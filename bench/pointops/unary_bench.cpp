@@ -81,7 +81,8 @@ PVX_BENCH_CASES(UnaryCases)
             pvxiAbs_16s_C1R(b.src.ptr<Pvx16s>(), static_cast<int>(b.src.step), b.dst.ptr<Pvx16s>(),
                             static_cast<int>(b.dst.step), roi);
         },
-        [](Bufs& b) { b.ref = cv::abs(b.src); }, [](const Bufs& b) { return cv::norm(b.dst, b.ref, cv::NORM_INF) == 0; });
+        [](Bufs& b) { b.ref = cv::abs(b.src); },
+        [](const Bufs& b) { return cv::norm(b.dst, b.ref, cv::NORM_INF) == 0; });
     AddCase(
         "Sqr_16u_C1RSfs_sf8", CV_16U, 0, 65536, 4,
         [](Bufs& b, PvxiSize roi) {
