@@ -119,11 +119,11 @@ struct IntDivOp {
         Widen32<U>(num, n);
         Widen32<U>(den, d);
         if (!wide) {
-            // (scale factor 0, the usual one, skips the multiply by 1)
-            if (sf == 0)
-                for (int i = 0; i < kN; ++i) r[i] = Sat(DivF(CvtI32F(n[i]), CvtI32F(d[i])));
-            else
-                for (int i = 0; i < kN; ++i) r[i] = Sat(DivF(MulF(CvtI32F(n[i]), scaleF), CvtI32F(d[i])));
+            for (int i = 0; i < kN; ++i) {
+                VF x = CvtI32F(n[i]);
+                if (sf != 0) x = MulF(x, scaleF);  // scale factor 0, the usual one, skips the multiply by 1
+                r[i] = Sat(DivF(x, CvtI32F(d[i])));
+            }
         } else {
             for (int i = 0; i < kN; ++i)
                 r[i] = SatI32<U, R>(DivD(MulD(CvtLoI32D(n[i]), scaleD), CvtLoI32D(d[i])),
