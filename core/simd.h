@@ -102,6 +102,7 @@ inline VI MulLoI16(VI a, VI b) { return _mm_mullo_epi16(a, b); }
 inline VI MulLoI32(VI a, VI b) { return _mm_mullo_epi32(a, b); }
 inline VI EqU8(VI a, VI b) { return _mm_cmpeq_epi8(a, b); }
 inline VI EqI32(VI a, VI b) { return _mm_cmpeq_epi32(a, b); }
+inline VI AddI8(VI a, VI b) { return _mm_add_epi8(a, b); }
 inline VI SubI8(VI a, VI b) { return _mm_sub_epi8(a, b); }
 inline VI AvgU8(VI a, VI b) { return _mm_avg_epu8(a, b); }     // (a + b + 1) >> 1
 inline VI AvgU16(VI a, VI b) { return _mm_avg_epu16(a, b); }   // (a + b + 1) >> 1

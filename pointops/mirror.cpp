@@ -24,6 +24,7 @@
 // 16s/16u and 32s/32f share them. Non-temporal stores: 8u C1 flip 0 when
 // width x height exceeds 2097152; four-channel members when the region is
 // larger than 512 kB and the largest cache (rows whose start is aligned).
+#include <array>
 #include <cstring>
 #include <utility>
 
@@ -82,21 +83,28 @@ struct Pixel {
     using Geo = ReverseGeometry<kSize, kVectors>;
     using Plan = ShufflePlan<kVectors, kVectors>;
 
+    // The source byte of each destination byte of a block, and the bytes of
+    // the fourth channel (blended back from the destination), as tables fixed
+    // at compile time.
+    static constexpr auto kSources = [] {
+        std::array<Bytes, 16 * kVectors> t{};
+        for (int b = 0; b < 16 * kVectors; ++b) t[b] = static_cast<Bytes>((kBlock - 1 - b / kSize) * kSize + b % kSize);
+        return t;
+    }();
+    static constexpr auto kAlphaBytes = [] {
+        std::array<Bytes, 16> t{};
+        for (int b = 0; b < 16; ++b) t[b] = (b / E) % 4 == 3 ? 0xFF : 0;
+        return t;
+    }();
     static Plan MakePlan()
     {
+        VI src[kVectors];
+        for (int k = 0; k < kVectors; ++k) src[k] = LoadU(kSources.data() + 16 * k);
         Plan plan;
-        int srcOf[16 * kVectors];
-        for (int b = 0; b < 16 * kVectors; ++b) srcOf[b] = (kBlock - 1 - b / kSize) * kSize + b % kSize;
-        BuildShufflePlan(plan, srcOf);
+        BuildShufflePlan(plan, src);
         return plan;
     }
-    // Bytes of the fourth channel (blended back from the destination).
-    static VI AlphaMask()
-    {
-        alignas(16) Bytes m[16];
-        for (int b = 0; b < 16; ++b) m[b] = (b / E) % 4 == 3 ? 0xFF : 0;
-        return LoadA(m);
-    }
+    static VI AlphaMask() { return LoadU(kAlphaBytes.data()); }
     static void Move(Bytes* d, const Bytes* s) { std::memcpy(d, s, kMoved); }
     static void Exchange(Bytes* a, Bytes* b)
     {

@@ -19,6 +19,7 @@
 //
 // Kernels work on bytes, templated by element size, so 16s/16u and 32s/32f
 // share them and 32f values move as bit patterns.
+#include <array>
 #include <cstring>
 
 #include "check.h"
@@ -67,26 +68,42 @@ PvxStatus CheckOrder(const int* dstOrder)
 }
 
 // Masks of one block of 16 / E pixels: the shuffles, and the bytes of kept
-// destination channels.
+// destination channels. The source byte of each destination byte is the
+// byte's place in its source pixel (fixed by the layout) plus the offset of
+// the channel that the order names, looked up with one byte shuffle a
+// vector; a kept channel's offset has its top bit set.
 template <int E, int Cin, int Cout>
 struct SwapPlan {
     ShufflePlan<Cin, Cout> shuffle;
     VI keep[Cout];
     bool anyKeep = false;
 
-    explicit SwapPlan(const int* ord)
-    {
-        int srcOf[16 * Cout];
-        alignas(16) std::uint8_t keepBytes[16 * Cout];
+    // Per destination byte b: its channel (first 16 * Cout bytes) and its
+    // source byte without the channel offset (the next 16 * Cout).
+    static constexpr auto kLayout = [] {
+        std::array<std::uint8_t, 32 * Cout> t{};
         for (int b = 0; b < 16 * Cout; ++b) {
             int p = b / (Cout * E), c = (b / E) % Cout, e = b % E;
-            bool kept = ord[c] == kKeep;
-            srcOf[b] = kept ? -1 : p * Cin * E + ord[c] * E + e;
-            keepBytes[b] = kept ? 0xFF : 0;
-            anyKeep = anyKeep || kept;
+            t[b] = static_cast<std::uint8_t>(c);
+            t[16 * Cout + b] = static_cast<std::uint8_t>(p * Cin * E + e);
         }
-        BuildShufflePlan(shuffle, srcOf);
-        for (int k = 0; k < Cout; ++k) keep[k] = LoadA(keepBytes + 16 * k);
+        return t;
+    }();
+
+    explicit SwapPlan(const int* ord)
+    {
+        alignas(16) std::uint8_t offset[16] = {};
+        for (int c = 0; c < Cout; ++c) offset[c] = ord[c] == kKeep ? 0x80 : static_cast<std::uint8_t>(ord[c] * E);
+        const VI offsets = LoadA(offset);
+        VI src[Cout], kept = Zero();
+        for (int k = 0; k < Cout; ++k) {
+            VI channel = LoadU(kLayout.data() + 16 * k), place = LoadU(kLayout.data() + 16 * (Cout + k));
+            src[k] = AddI8(ShuffleBytes(offsets, channel), place);
+            keep[k] = And(src[k], SplatU8(0x80));  // SelectBytes looks at the top bit only
+            kept = Or(kept, keep[k]);
+        }
+        anyKeep = MaskBytes(kept) != 0;
+        BuildShufflePlan(shuffle, src);
     }
 };
 
