@@ -50,7 +50,7 @@ void FillRows(const T* value, Byte* dst, int dstStep, PvxiSize roi)
 {
     constexpr int kP = C * sizeof(T);
     Pixel<T, C> pix(value, C);
-    move::FillPattern pat = move::MakeFillPattern(pix.bytes, kP);
+    move::FillPattern pat = move::MakeFillPattern<kP>(pix.bytes);
     std::ptrdiff_t rowBytes = static_cast<std::ptrdiff_t>(roi.width) * kP;
     int rows = roi.height;
     bool nt = UseNonTemporal(rowBytes * rows, kNtThresholdSet);

@@ -227,7 +227,8 @@ TEST(Set, StreamedFillEqualsOrdinaryFill)
     using pvx::move::Byte;
     const Byte pix[12] = {1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12};
     for (int p : {1, 2, 3, 4, 6, 8, 12}) {
-        pvx::move::FillPattern pat = pvx::move::MakeFillPattern(pix, p);
+        pvx::move::FillPattern pat;
+        for (int i = 0; i < 64; ++i) pat.bytes[i] = pix[i % p];
         for (int n : {1, 15, 16, 17, 47, 48, 63, 64, 65, 100, 1000, 1027}) {
             for (int off = 0; off < 16; ++off) {
                 std::vector<Byte> a(n + 64, 0), b(n + 64, 0);
