@@ -188,12 +188,14 @@ void RunCase(const Member& m, Shape s, Rng& rng)
     const int S = m.elemBytes, w = s.width, h = s.height;
     ShapeOptions o;
     o.randomPad = RandInt(rng, 0, 2) != 0;  // else contiguous rows
+    o.tightEnd = RandInt(rng, 0, 1) != 0;    // images end with the last row: overreads reach ASan
     const bool flip = RandInt(rng, 0, 3) == 0;
     const int k = RandInt(rng, 0, (f.srcC > f.dstC ? f.srcC : f.dstC) - 1);
     const int maskMode = RandInt(rng, 0, 5) == 0 ? 1 : (RandInt(rng, 0, 5) == 0 ? 2 : 0);
     const int flagsPick[] = {0, 1, 2, 3, -1, 6};
     const int flags = flagsPick[RandInt(rng, 0, 5)];
-    SCOPED_TRACE(::testing::Message() << "k " << k << " flip " << flip << " contiguous " << !o.randomPad << " mask "
+    SCOPED_TRACE(::testing::Message() << "k " << k << " flip " << flip << " contiguous " << !o.randomPad << " tight "
+                                      << o.tightEnd << " mask "
                                       << maskMode << " flags " << flags);
 
     GuardedImage src = MakeSide(w, h, f.srcC, f.srcPlanar, S, rng, o);
