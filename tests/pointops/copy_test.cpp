@@ -415,7 +415,7 @@ void CheckStreamedRow(int inStreams, int outStreams, Rng& rng)
     using pvx::move::Byte;
     for (int w : {1, 3, 4, 5, 17, 64, 301}) {
         for (int off = 0; off < 16; off += 4) {
-            for (int skew : {0, 4}) {
+            for (int skew : {0, 4, 8}) {
                 const std::size_t plane = (static_cast<std::size_t>(w) * M::kOutPix + 15) / 16 * 16 + 64;
                 std::vector<Byte> in(4 * (static_cast<std::size_t>(w) * M::kInPix + 64));
                 for (auto& b : in) b = static_cast<Byte>(rng());
