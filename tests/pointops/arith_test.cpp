@@ -279,6 +279,13 @@ TEST(Add, ConstantZeroCopiesTheSource)
     GuardedImage s = MakeImage<Pvx8u>(77, 5, 1, rng), d = MakeImage<Pvx8u>(77, 5, 1, rng);
     ASSERT_EQ(pvxiAddC_8u_C1RSfs(s.ptr<Pvx8u>(), s.step(), 0, d.ptr<Pvx8u>(), d.step(), {77, 5}, 0), pvxStsNoErr);
     EXPECT_TRUE(RegionEquals(d, s.Packed<Pvx8u>()));
+
+    // One pointer with different steps is not in place: a zero source step
+    // copies the first row into every row.
+    auto want = d.Packed<Pvx8u>();
+    for (std::size_t i = 77; i < want.size(); ++i) want[i] = want[i % 77];
+    ASSERT_EQ(pvxiAddC_8u_C1RSfs(d.ptr<Pvx8u>(), 0, 0, d.ptr<Pvx8u>(), d.step(), {77, 5}, 0), pvxStsNoErr);
+    EXPECT_TRUE(RegionEquals(d, want));
 }
 
 TEST(Add, ContiguousRowsGiveTheSameResult)

@@ -375,8 +375,23 @@ TEST(Div, Exhaustive8u)
         }
 }
 
+// A dividend x in [0, d) whose quotient x 2^-sf / d lies 1 / (2 d) from a
+// half-integer, above it for r = 1 and below for r = -1 (odd d > 1, sf < 0):
+// 2^(1-sf) x = r (mod d).
+int NearTieDividend(int d, int sf, int r)
+{
+    long long m = 1;
+    for (int i = 0; i < 1 - sf; ++i) m = m * 2 % d;
+    const long long want = (r % d + d) % d;
+    for (int x = 0; x < d; ++x)
+        if (m * x % d == want) return x;
+    return 0;
+}
+
 // 16-bit quotients near rounding boundaries: dividends and divisors chosen so
-// that many quotients are ties or one step off a tie.
+// that many quotients are ties or one step off a tie. Below scale factor 0
+// half of them are the closest non-ties that a scaled quotient can be, with
+// divisors up to 1023 and quotients up to the saturation point.
 TEST(Div, SixteenBitRoundingBoundaries)
 {
     Rng rng = MakeRng(11);
@@ -393,6 +408,18 @@ TEST(Div, SixteenBitRoundingBoundaries)
             n[i] = static_cast<Pvx16s>(std::clamp(nv, -32768, 32767));
             du[i] = static_cast<Pvx16u>(std::abs(dv));
             nu[i] = static_cast<Pvx16u>(std::clamp(std::abs(nv) * 2 + RandInt(rng, -1, 1), 0, 65535));
+            if (sf < 0 && RandInt(rng, 0, 1)) {
+                const int dd = 2 * RandInt(rng, 1, 511) + 1, r = RandInt(rng, 0, 1) ? 1 : -1;
+                const int x = NearTieDividend(dd, sf, r);
+                // the largest dividend whose quotient is not saturated
+                const int top16u = static_cast<int>(std::min<long long>(65535, (65535LL * dd) >> -sf));
+                const int top16s = static_cast<int>(std::min<long long>(32767, (32767LL * dd) >> -sf));
+                du[i] = static_cast<Pvx16u>(dd);
+                nu[i] = static_cast<Pvx16u>(x + dd * RandInt(rng, 0, std::max(0, top16u - x) / dd));
+                d[i] = static_cast<Pvx16s>(RandInt(rng, 0, 1) ? dd : -dd);
+                const int ns = x + dd * RandInt(rng, 0, std::max(0, top16s - x) / dd);
+                n[i] = static_cast<Pvx16s>(RandInt(rng, 0, 1) ? ns : -ns);
+            }
         }
         for (int mode = 0; mode <= 2; ++mode) {
             ASSERT_EQ(pvxiDiv_Round_16s_C1RSfs(d.data(), 2 * N, n.data(), 2 * N, q.data(), 2 * N, {N, 1}, mode, sf), 0);

@@ -212,6 +212,18 @@ TEST(Mirror, DiagonalCheckOrder)
         EXPECT_TRUE(NothingWritten(f(d, ds, d, ds + 4, {4, 4}, flip), pvxStsNotSupportedModeErr, dst));  // overlap
         EXPECT_EQ(f(s, ss, d, ds, {6, 4}, flip), pvxStsNoErr);
         dst.Snapshot();
+
+        // Steps that just hold their rows, and regions that touch without
+        // overlapping (either one first in memory), are usable together.
+        std::vector<Pvx32f> buf(48);
+        for (int i = 0; i < 48; ++i) buf[i] = static_cast<Pvx32f>(i);
+        const std::vector<Pvx32f> first(buf.begin(), buf.begin() + 24);
+        ASSERT_EQ(f(buf.data(), 24, buf.data() + 24, 16, {6, 4}, flip), pvxStsNoErr);  // source, then destination
+        EXPECT_EQ(std::vector<Pvx32f>(buf.begin() + 24, buf.end()), RefDiagonal(first, 6, 4, flip));
+        EXPECT_EQ(std::vector<Pvx32f>(buf.begin(), buf.begin() + 24), first);
+        ASSERT_EQ(f(buf.data() + 24, 16, buf.data(), 24, {4, 6}, flip), pvxStsNoErr);  // destination, then source
+        EXPECT_EQ(std::vector<Pvx32f>(buf.begin(), buf.begin() + 24),
+                  RefDiagonal(RefDiagonal(first, 6, 4, flip), 4, 6, flip));
     }
     // The same pointer with equal steps is the in-place form: -21.
     EXPECT_TRUE(NothingWritten(f(d, ds, d, ds, {4, 4}, 3), pvxStsMirrorFlipErr, dst));
