@@ -32,9 +32,9 @@ inline void BuildShufflePlan(ShufflePlan<NIn, NOut>& plan, const simd::VI* src)
     using namespace simd;
     const VI low = SplatU8(0x0F), high = SplatU8(0xF0), none = SplatU8(0x80);
     for (int k = 0; k < NOut; ++k) {
-        VI lane = And(src[k], low), vector = And(src[k], high);
+        VI lane = And(src[k], low), from = And(src[k], high);  // byte within, and 16 x the source vector
         for (int j = 0; j < NIn; ++j) {
-            VI mine = EqU8(vector, SplatU8(static_cast<std::uint8_t>(16 * j)));
+            VI mine = EqU8(from, SplatU8(static_cast<std::uint8_t>(16 * j)));
             plan.mask[k][j] = Or(And(mine, lane), AndNot(mine, none));
         }
     }
