@@ -115,20 +115,35 @@ inline constexpr float kLn2Hi = 0.693359375f, kLn2Lo = -2.12194440e-4f;
 // c1 x + c0.
 inline VF Lin(VF x, float c1, float c0) { return AddF(MulF(SplatF(c1), x), SplatF(c0)); }
 
+// e^r for r = c - n ln 2, with n = c log2 e rounded (c in [-104, 89]).
+[[gnu::always_inline]] inline VF ExpReducedF(VF c, VF& n)
+{
+    n = RoundEvenF(MulF(c, SplatF(1.44269504088896341f)));
+    VF r = SubF(SubF(c, MulF(n, SplatF(kLn2Hi))), MulF(n, SplatF(kLn2Lo)));
+    VF q = SplatF(1.9875691500e-4f);
+    for (float k : {1.3981999507e-3f, 8.3334519073e-3f, 4.1665795894e-2f, 1.6666665459e-1f, 5.0000001201e-1f})
+        q = AddF(MulF(q, r), SplatF(k));
+    return AddF(AddF(MulF(q, MulF(r, r)), r), SplatF(1.0f));
+}
+
 // e^x: n = x log2 e rounded, r = x - n ln 2 (|r| <= ln 2 / 2), a polynomial for
 // e^r by Horner's rule, times 2^n as two factors, so that results near
 // overflow and in the subnormal range are rounded once. Inputs are clamped to
 // [-104, 89], beyond which every result is 0 or infinite; NaN stays NaN.
 // (Pairing the terms as for ln below is 13% faster but reaches 1.014 ulp.)
-inline VF ExpF(VF x)
+[[gnu::always_inline]] inline VF ExpF(VF x)
 {
+    // Where every lane's result is a normal number (|n| <= 125), 2^n goes
+    // straight into the exponent field of e^r, which is what the two factors
+    // below give there, bit for bit; NaN fails the test.
+    if (MaskF(AndF(GeF(x, SplatF(-86.0f)), GeF(SplatF(87.0f), x))) == 0xF) {
+        VF n;
+        VF p = ExpReducedF(x, n);
+        return AsFloat(AddI32(AsInt(p), SllI32n(CvtF32(n), 23)));
+    }
     VF c = MinF(MaxF(x, SplatF(-104.0f)), SplatF(89.0f));
-    VF n = RoundEvenF(MulF(c, SplatF(1.44269504088896341f)));
-    VF r = SubF(SubF(c, MulF(n, SplatF(kLn2Hi))), MulF(n, SplatF(kLn2Lo)));
-    VF q = SplatF(1.9875691500e-4f);
-    for (float k : {1.3981999507e-3f, 8.3334519073e-3f, 4.1665795894e-2f, 1.6666665459e-1f, 5.0000001201e-1f})
-        q = AddF(MulF(q, r), SplatF(k));
-    VF p = AddF(AddF(MulF(q, MulF(r, r)), r), SplatF(1.0f));
+    VF n;
+    VF p = ExpReducedF(c, n);
     VI ni = CvtF32(n);
     VI n1 = SraI32n(ni, 1), n2 = SubI32(ni, n1);
     VF s1 = AsFloat(SllI32n(AddI32(n1, SplatU32(127)), 23));
@@ -136,18 +151,19 @@ inline VF ExpF(VF x)
     return SelectF(AddF(x, x), MulF(MulF(p, s1), s2), OrderedF(x));
 }
 
-// ln x of positive normal x times 2^(126 - bias): x = m 2^e with m in
+// ln x of positive normal x times 2^-shift: x = m 2^e with m in
 // [sqrt(1/2), sqrt(2)), ln(1 + f) for f = m - 1 by a polynomial, plus e ln 2
 // in two parts. The polynomial's terms are paired (Estrin's scheme), which
 // halves the chain of dependent operations of Horner's rule: 1.2 times faster.
-inline VF LnNormalF(VF x, VI bias)
+[[gnu::always_inline]] inline VF LnNormalF(VF x, VI shift)
 {
-    VI bits = AsInt(x);
-    VI e = SubI32(SrlI32n(bits, 23), bias);
-    VF m = AsFloat(Or(And(bits, SplatU32(0x007FFFFF)), SplatU32(0x3F000000)));  // [1/2, 1)
-    VF below = LtF(m, SplatF(0.707106781186547524f));
-    e = AddI32(e, AsInt(below));  // one less where m is doubled
-    VF f = SubF(AddF(m, AndF(below, m)), SplatF(1.0f));
+    // Offsetting the bits by those of sqrt(1/2) moves the exponent's step to
+    // m = sqrt(1/2): e and m come out of one subtraction, a shift and a mask.
+    constexpr std::int32_t kSqrtHalf = 0x3F3504F3;
+    VI off = SubI32(AsInt(x), SplatU32(kSqrtHalf));
+    VI e = SubI32(SraI32n(off, 23), shift);
+    VF m = AsFloat(AddI32(And(off, SplatU32(0x007FFFFF)), SplatU32(kSqrtHalf)));
+    VF f = SubF(m, SplatF(1.0f));  // exact: m is within a factor 2 of 1
     VF ef = CvtI32F(e);
     VF f2 = MulF(f, f), f4 = MulF(f2, f2), f3 = MulF(f2, f);
     VF hi = AddF(MulF(AddF(MulF(SplatF(7.0376836292e-2f), f2), Lin(f, -1.1514610310e-1f, 1.1676998740e-1f)), f2),
@@ -161,12 +177,12 @@ inline VF LnNormalF(VF x, VI bias)
 // ln x of any x: subnormal inputs are scaled by 2^23 first; a negative x or
 // NaN gives NaN, 0 gives -inf, +inf stays +inf. Vectors of positive normal
 // values, the usual case, skip all of that.
-inline VF LnF(VF x)
+[[gnu::always_inline]] inline VF LnF(VF x)
 {
     constexpr float kInf = std::numeric_limits<float>::infinity();
-    if (MaskF(AndF(GeF(x, SplatF(0x1p-126f)), LtF(x, SplatF(kInf)))) == 0xF) return LnNormalF(x, SplatU32(126));
+    if (MaskF(AndF(GeF(x, SplatF(0x1p-126f)), LtF(x, SplatF(kInf)))) == 0xF) return LnNormalF(x, Zero());
     VF tiny = LtF(x, SplatF(0x1p-126f));
-    VF r = LnNormalF(SelectF(x, MulF(x, SplatF(0x1p23f)), tiny), AddI32(SplatU32(126), And(AsInt(tiny), SplatU32(23))));
+    VF r = LnNormalF(SelectF(x, MulF(x, SplatF(0x1p23f)), tiny), And(AsInt(tiny), SplatU32(23)));
     VF nan = OrF(LtF(x, ZeroF()), AndNotF(OrderedF(x), SplatF(-0.0f)));  // the sign bit selects
     r = SelectF(r, SplatF(kInf), EqF(x, SplatF(kInf)));
     r = SelectF(r, SplatF(-kInf), EqF(x, ZeroF()));
@@ -335,7 +351,7 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
             for (int h = 0; h < 16; ++h) table[h] = LoadA(t + 16 * h);
         }
     }
-    VI Vec(VI a) const
+    [[gnu::always_inline]] VI Vec(VI a) const
     {
         if constexpr (std::is_same_v<T, Pvx8u>) {
             // 8u: one byte shuffle of each register of the table by the low
