@@ -133,7 +133,7 @@ inline VF Lin(VF x, float c1, float c0) { return AddF(MulF(SplatF(c1), x), Splat
 // (Pairing the terms as for ln below is 13% faster but reaches 1.014 ulp.)
 [[gnu::always_inline]] inline VF ExpF(VF x)
 {
-    // Where every lane's result is a normal number (|n| <= 125), 2^n goes
+    // Where every lane's result is a normal number (n in [-124, 126]), 2^n goes
     // straight into the exponent field of e^r, which is what the two factors
     // below give there, bit for bit; NaN fails the test.
     if (MaskF(AndF(GeF(x, SplatF(-86.0f)), GeF(SplatF(87.0f), x))) == 0xF) {
