@@ -8,6 +8,7 @@
 #include <smmintrin.h>
 
 #include <cstdint>
+#include <cstring>
 
 namespace pvx::simd {
 
@@ -30,6 +31,19 @@ inline void StoreNt(void* p, VI v) { _mm_stream_si128(static_cast<VI*>(p), v); }
 inline void StoreLo64(void* p, VI v) { _mm_storel_epi64(static_cast<VI*>(p), v); }
 inline void StoreFence() { _mm_sfence(); }
 inline void StoreHi64(void* p, VI v) { _mm_storel_epi64(static_cast<VI*>(p), _mm_unpackhi_epi64(v, v)); }
+// The low 32 bits, through memcpy as the address may have any alignment.
+inline VI LoadLo32(const void* p)
+{
+    int x;
+    std::memcpy(&x, p, 4);
+    return _mm_cvtsi32_si128(x);
+}
+template <int kLane>
+inline void Store32(void* p, VI v)
+{
+    int x = _mm_extract_epi32(v, kLane);
+    std::memcpy(p, &x, 4);
+}
 inline void Prefetch(const void* p) { _mm_prefetch(static_cast<const char*>(p), _MM_HINT_T0); }  // a hint: never faults
 
 inline VF LoadUF(const float* p) { return _mm_loadu_ps(p); }

@@ -381,7 +381,9 @@ struct Pattern {
     static constexpr int kUnits = kRegs * kLanes;
     static_assert(simd::kBytes % sizeof(U) == 0 && kRegs <= 3);
 
-    alignas(16) U unit[kUnits];
+    // A register's worth past the pattern, so that a register starting at
+    // any unit finds its constants in one load (CstAt).
+    alignas(16) U unit[kUnits + kLanes];
     simd::VI cst[kRegs];
     simd::VI alpha[kRegs];
 
@@ -389,8 +391,8 @@ struct Pattern {
     // time, where it was built byte by byte on every call and then loaded as
     // vectors, a store-to-load forward that fails on every load.
     static constexpr auto kAlphaBytes = [] {
-        std::array<std::uint8_t, kRegs * simd::kBytes> m{};
-        for (int j = 0; j < kRegs * simd::kBytes; ++j)
+        std::array<std::uint8_t, (kRegs + 1) * simd::kBytes> m{};
+        for (int j = 0; j < (kRegs + 1) * simd::kBytes; ++j)
             m[j] = j % kPixelBytes >= kKeptUnits * static_cast<int>(sizeof(U)) ? 0xFF : 0;
         return m;
     }();
@@ -405,12 +407,19 @@ struct Pattern {
         }
         if (!value) return;
         const U* v = reinterpret_cast<const U*>(value);
-        for (int i = 0; i < kUnits; ++i) {
+        for (int i = 0; i < kUnits + kLanes; ++i) {
             int c = i % kPixelUnits;
             unit[i] = c < kKeptUnits ? v[c] : U{};
         }
         for (int r = 0; r < kRegs; ++r)
             cst[r] = simd::LoadA(reinterpret_cast<const std::uint8_t*>(unit) + r * simd::kBytes);
+    }
+
+    // The constant and alpha mask of a register starting at unit s of a row.
+    simd::VI CstAt(std::ptrdiff_t s) const { return simd::LoadU(unit + s % kPixelUnits); }
+    static simd::VI AlphaAt(std::ptrdiff_t s)
+    {
+        return simd::LoadU(kAlphaBytes.data() + s % kPixelUnits * static_cast<std::ptrdiff_t>(sizeof(U)));
     }
 };
 
@@ -423,11 +432,79 @@ inline constexpr int kPrefetchAhead = 1024;
 template <class Op>
 concept HasVec4 = requires(const Op& o, const simd::VI* v, simd::VI* r) { o.Vec4(v, v, r); };
 
+// Ops whose result depends on where a register starts (Div_32f's groups of
+// four) state kScalarTail; the others map each lane on its own, and a row's
+// last partial register may be run again over units already done.
+template <class Op>
+concept ScalarTailOp = requires { requires Op::kScalarTail; };
+
 // One row of n units: d = op(a, b), op(a, value pattern) or op(a). Vector body
-// in groups of the pattern's registers, scalar tail (never re-running a vector
-// over done units, so in-place rows stay right). AC4: the alpha units of d keep
-// their value. A selects aligned loads and stores, kNt (aligned rows only)
-// streamed stores of the vectors, fenced by the caller.
+// in groups of the pattern's registers, then single registers, then the rest:
+// one more register ending at the row's end, or two overlapping halves in a
+// row shorter than a register, or (ops of kScalarTail, rows under half a
+// register) scalar units. The overlapping registers read their inputs before
+// anything is stored, so units done twice get the same value in place too.
+// AC4: the alpha units of d keep their value. A selects aligned loads and
+// stores, kNt (aligned rows only) streamed stores of the vectors, fenced by
+// the caller.
+// The op on one register's inputs: two images, an image and a constant, or
+// one image; AC4 keeps the bytes of vd that keep selects.
+template <class Op, Src2 K, bool kAlpha>
+[[gnu::always_inline]] inline simd::VI ApplyOp(const Op& o, simd::VI va, simd::VI vb, simd::VI c, simd::VI vd,
+                                               simd::VI keep)
+{
+    simd::VI v;
+    if constexpr (K == Src2::kImage) v = o.Vec(va, vb);
+    else if constexpr (K == Src2::kConst) v = o.Vec(va, c);
+    else v = o.Vec(va);
+    if constexpr (kAlpha) v = simd::SelectBytes(v, vd, keep);
+    return v;
+}
+
+// A row of n units, fewer than a register but at least kPart bytes: two parts
+// of kPart bytes, [0, h) and [n - h, n), in one register, both read before
+// either is stored. False where the op or layout does not allow it (ops of
+// kScalarTail; AC4 parts that do not start on a pixel, as the ops' alpha
+// lanes are fixed) or the row is shorter.
+template <int kPart, Src2 K, class Op, class T, Lay L>
+[[gnu::noinline]] bool PartsRow(const Op& o, const Pattern<typename Op::Unit, T, L>& pat,
+                                            const typename Op::Unit* a, const typename Op::Unit* b,
+                                            typename Op::Unit* d, std::ptrdiff_t n)
+{
+    using namespace simd;
+    using P = Pattern<typename Op::Unit, T, L>;
+    constexpr bool kAlpha = kKeepsAlpha<L>;
+    constexpr int kPartUnits = kPart / static_cast<int>(sizeof(typename Op::Unit));
+    if constexpr (kPartUnits == 0 || ScalarTailOp<Op> || (kAlpha && kPartUnits % P::kPixelUnits != 0)) {
+        return false;
+    } else {
+        if (n < kPartUnits) return false;
+        std::ptrdiff_t s = n - kPartUnits;
+        // (4-byte parts fill the register twice: no lane is left 0 to look
+        // like a zero divisor or a logarithm of 0)
+        auto join = [](VI lo, VI hi) {
+            if constexpr (kPart == 8) return InterleaveLo64(lo, hi);
+            VI t = InterleaveLo32(lo, hi);
+            return InterleaveLo64(t, t);
+        };
+        auto both = [&](const auto* p) {
+            if constexpr (kPart == 8) return join(LoadLo64(p), LoadLo64(p + s));
+            else return join(LoadLo32(p), LoadLo32(p + s));
+        };
+        VI v = ApplyOp<Op, K, kAlpha>(o, both(a), K == Src2::kImage ? both(b) : Zero(),
+                                      K == Src2::kConst ? join(pat.CstAt(0), pat.CstAt(s)) : Zero(),
+                                      kAlpha ? both(d) : Zero(), join(P::AlphaAt(0), P::AlphaAt(s)));
+        if constexpr (kPart == 8) {
+            StoreLo64(d, v);
+            StoreHi64(d + s, v);
+        } else {
+            Store32<0>(d, v);
+            Store32<1>(d + s, v);
+        }
+        return true;
+    }
+}
+
 template <class Op, class T, Lay L, Src2 K, bool A, bool kNt = false>
 void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const typename Op::Unit* a,
               const typename Op::Unit* b, typename Op::Unit* d, std::ptrdiff_t n)
@@ -447,6 +524,21 @@ void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const t
             alpha[r] = pat.alpha[r];
         }
         std::ptrdiff_t nv = o.Vector() ? n : 0;
+        if (nv < P::kLanes && (PartsRow<8, K>(o, pat, a, b, d, nv) || PartsRow<4, K>(o, pat, a, b, d, nv))) return;
+        // The last partial register, as one more register ending at the row's
+        // end, read before anything is stored (lane-wise ops; AC4 only where
+        // every register starts on a pixel).
+        constexpr bool kTail = !ScalarTailOp<Op> && (!kAlpha || P::kLanes % P::kPixelUnits == 0);
+        std::ptrdiff_t last = -1;
+        VI lastV = Zero();
+        if constexpr (kTail) {
+            if (nv > P::kLanes && nv % P::kLanes != 0) {
+                last = nv - P::kLanes;
+                lastV = ApplyOp<Op, K, kAlpha>(o, LoadU(a + last), K == Src2::kImage ? LoadU(b + last) : Zero(),
+                                               K == Src2::kConst ? pat.CstAt(last) : Zero(),
+                                               kAlpha ? LoadU(d + last) : Zero(), P::AlphaAt(last));
+            }
+        }
         if constexpr (HasVec4<Op> && K == Src2::kImage && P::kRegs == 1) {
             for (; i + 4 * P::kUnits <= nv; i += 4 * P::kUnits) {
                 VI va[4], vb[4], v[4];
@@ -469,14 +561,21 @@ void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const t
         for (; i + P::kUnits <= nv; i += P::kUnits) {
             for (int r = 0; r < P::kRegs; ++r) {
                 std::ptrdiff_t j = i + r * P::kLanes;
-                VI va = Load<A>(a + j);
-                VI v;
-                if constexpr (K == Src2::kImage) v = o.Vec(va, Load<A>(b + j));
-                else if constexpr (K == Src2::kConst) v = o.Vec(va, cst[r]);
-                else v = o.Vec(va);
-                if constexpr (kAlpha) v = SelectBytes(v, Load<A>(d + j), alpha[r]);
-                Store<A, kNt>(d + j, v);
+                Store<A, kNt>(d + j, ApplyOp<Op, K, kAlpha>(o, Load<A>(a + j),
+                                                            K == Src2::kImage ? Load<A>(b + j) : Zero(), cst[r],
+                                                            kAlpha ? Load<A>(d + j) : Zero(), alpha[r]));
             }
+        }
+        // Whole registers short of a pattern (C3: up to two) go as registers
+        // too, each with its place in the pattern: a C3 row of 8 or 11 8u
+        // pixels has no whole pattern at all.
+        for (int r = 0; r < P::kRegs - 1 && i + P::kLanes <= nv; ++r, i += P::kLanes)
+            Store<A, kNt>(d + i, ApplyOp<Op, K, kAlpha>(o, Load<A>(a + i),
+                                                        K == Src2::kImage ? Load<A>(b + i) : Zero(), cst[r],
+                                                        kAlpha ? Load<A>(d + i) : Zero(), alpha[r]));
+        if (last >= 0) {
+            StoreU(d + last, lastV);
+            return;
         }
     }
     for (; i < n; ++i) {

@@ -217,6 +217,7 @@ struct Div32fOp {
     bool* zero = nullptr;  // set when a zero divisor is met (the row loop copies the op)
 
     static constexpr bool kHasVector = true;
+    static constexpr bool kScalarTail = true;  // a register is a group: the tail stays groups of one
     bool Vector() const { return true; }
     VI Vec(VI a, VI b) const
     {
