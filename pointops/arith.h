@@ -438,15 +438,6 @@ concept HasVec4 = requires(const Op& o, const simd::VI* v, simd::VI* r) { o.Vec4
 template <class Op>
 concept ScalarTailOp = requires { requires Op::kScalarTail; };
 
-// One row of n units: d = op(a, b), op(a, value pattern) or op(a). Vector body
-// in groups of the pattern's registers, then single registers, then the rest:
-// one more register ending at the row's end, or two overlapping halves in a
-// row shorter than a register, or (ops of kScalarTail, rows under half a
-// register) scalar units. The overlapping registers read their inputs before
-// anything is stored, so units done twice get the same value in place too.
-// AC4: the alpha units of d keep their value. A selects aligned loads and
-// stores, kNt (aligned rows only) streamed stores of the vectors, fenced by
-// the caller.
 // The op on one register's inputs: two images, an image and a constant, or
 // one image; AC4 keeps the bytes of vd that keep selects.
 template <class Op, Src2 K, bool kAlpha>
@@ -465,11 +456,12 @@ template <class Op, Src2 K, bool kAlpha>
 // of kPart bytes, [0, h) and [n - h, n), in one register, both read before
 // either is stored. False where the op or layout does not allow it (ops of
 // kScalarTail; AC4 parts that do not start on a pixel, as the ops' alpha
-// lanes are fixed) or the row is shorter.
+// lanes are fixed) or the row is shorter. Out of line, so that the row
+// function stays small enough to be inlined into the row loop (called per
+// row, it copies the op, all its scale-factor constants, per row).
 template <int kPart, Src2 K, class Op, class T, Lay L>
-[[gnu::noinline]] bool PartsRow(const Op& o, const Pattern<typename Op::Unit, T, L>& pat,
-                                            const typename Op::Unit* a, const typename Op::Unit* b,
-                                            typename Op::Unit* d, std::ptrdiff_t n)
+[[gnu::noinline]] bool PartsRow(const Op& o, const Pattern<typename Op::Unit, T, L>& pat, const typename Op::Unit* a,
+                                const typename Op::Unit* b, typename Op::Unit* d, std::ptrdiff_t n)
 {
     using namespace simd;
     using P = Pattern<typename Op::Unit, T, L>;
@@ -505,6 +497,15 @@ template <int kPart, Src2 K, class Op, class T, Lay L>
     }
 }
 
+// One row of n units: d = op(a, b), op(a, value pattern) or op(a). Vector body
+// in groups of the pattern's registers, then single registers, then the rest:
+// one more register ending at the row's end, or two overlapping parts in a
+// row shorter than a register, or (ops of kScalarTail, rows under 4 bytes)
+// scalar units. The overlapping registers read their inputs before
+// anything is stored, so units done twice get the same value in place too.
+// AC4: the alpha units of d keep their value. A selects aligned loads and
+// stores, kNt (aligned rows only) streamed stores of the vectors, fenced by
+// the caller.
 template <class Op, class T, Lay L, Src2 K, bool A, bool kNt = false>
 void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const typename Op::Unit* a,
               const typename Op::Unit* b, typename Op::Unit* d, std::ptrdiff_t n)
