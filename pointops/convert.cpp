@@ -36,25 +36,65 @@ inline VF RoundHalfUp(VF v)
     return AddF(t, up);
 }
 
-// Converts n floats to 8u under the current rounding control (modes 0 and 1)
-// or half away from zero (mode 2); 16 elements a step, scalar tail.
+// 16 floats to 16 bytes under the current rounding control (modes 0 and 1)
+// or half away from zero (mode 2).
+template <bool kHalfAway>
+inline VI Convert16(const VF* v)
+{
+    VI q[4];
+    for (int k = 0; k < 4; ++k) {
+        VF c = Clamp8u(v[k]);
+        q[k] = kHalfAway ? CvtTruncF32(RoundHalfUp(c)) : CvtF32(c);
+    }
+    return PackUsS16(PackSsS32(q[0], q[1]), PackSsS32(q[2], q[3]));
+}
+
+// Converts n floats to 8u, 16 elements a step. The rest is one more step
+// ending at the row's end, over elements already done (its floats read before
+// anything is stored); rows of 4 to 15 elements are two overlapping parts of
+// 8 or 4 in one step. Only rows under 4 elements go one by one: an 8x8 tile
+// had been all scalar, 8 conversions a row.
 template <bool kHalfAway>
 void Convert32f8uRow(const float* src, std::uint8_t* dst, std::ptrdiff_t n)
 {
-    std::ptrdiff_t i = 0;
-    for (; i + 16 <= n; i += 16) {
-        VI q[4];
-        for (int k = 0; k < 4; ++k) {
-            VF v = Clamp8u(LoadUF(src + i + 4 * k));
-            q[k] = kHalfAway ? CvtTruncF32(RoundHalfUp(v)) : CvtF32(v);
+    auto load4 = [&](std::ptrdiff_t i, VF* v) {
+        for (int k = 0; k < 4; ++k) v[k] = LoadUF(src + i + 4 * k);
+    };
+    if (n < 16) {
+        VF v[4];
+        if (n >= 8) {
+            v[0] = LoadUF(src), v[1] = LoadUF(src + 4), v[2] = LoadUF(src + n - 8), v[3] = LoadUF(src + n - 4);
+            VI r = Convert16<kHalfAway>(v);
+            StoreLo64(dst, r);
+            StoreHi64(dst + n - 8, r);
+            return;
         }
-        StoreU(dst + i, PackUsS16(PackSsS32(q[0], q[1]), PackSsS32(q[2], q[3])));
+        if (n >= 4) {
+            v[0] = v[2] = LoadUF(src), v[1] = v[3] = LoadUF(src + n - 4);
+            VI r = Convert16<kHalfAway>(v);
+            Store32<0>(dst, r);
+            Store32<1>(dst + n - 4, r);
+            return;
+        }
+        for (std::ptrdiff_t i = 0; i < n; ++i) {
+            VF c = _mm_set_ss(Clamp8u(src[i]));
+            int r = kHalfAway ? _mm_cvttss_si32(RoundHalfUp(c)) : _mm_cvtss_si32(c);
+            dst[i] = static_cast<std::uint8_t>(r);
+        }
+        return;
     }
-    for (; i < n; ++i) {
-        VF v = _mm_set_ss(Clamp8u(src[i]));
-        int r = kHalfAway ? _mm_cvttss_si32(RoundHalfUp(v)) : _mm_cvtss_si32(v);
-        dst[i] = static_cast<std::uint8_t>(r);
+    VI last = Zero();
+    if (n % 16 != 0) {
+        VF v[4];
+        load4(n - 16, v);
+        last = Convert16<kHalfAway>(v);
     }
+    for (std::ptrdiff_t i = 0; i + 16 <= n; i += 16) {
+        VF v[4];
+        load4(i, v);
+        StoreU(dst + i, Convert16<kHalfAway>(v));
+    }
+    if (n % 16 != 0) StoreU(dst + n - 16, last);
 }
 
 template <class S, class D, Lay L>

@@ -62,16 +62,19 @@ TEST(Convert, RestoresTheCallersRoundingControl)
     float src[3] = {0.5f, 1.5f, 2.5f};
     Pvx8u dst[3];
     // The results follow the mode, not the caller's control: 19 elements run
-    // the vector body and the scalar tail.
+    // a whole step and one overlapping it, 11 and 6 two parts of 8 and of 4,
+    // 3 the scalar path.
     float ties[19];
     Pvx8u got[19];
     for (int i = 0; i < 19; ++i) ties[i] = static_cast<float>(i % 7) + (i % 3 == 0 ? 0.5f : i % 3 == 1 ? 0.25f : 0.75f);
     for (unsigned rc : {0x0000u, 0x2000u, 0x4000u, 0x6000u}) {
         _mm_setcsr((before & ~0x6000u) | rc);
         for (int mode : {0, 1, 2, 3}) {
-            ASSERT_EQ(pvxiConvert_32f8u_C1R(ties, 76, got, 19, {19, 1}, mode), pvxStsNoErr);
-            for (int i = 0; i < 19; ++i)
-                EXPECT_EQ(got[i], RefConvert8u(ties[i], mode)) << "control " << rc << " mode " << mode << " " << i;
+            for (int w : {19, 11, 6}) {
+                ASSERT_EQ(pvxiConvert_32f8u_C1R(ties, 76, got, 19, {w, 1}, mode), pvxStsNoErr);
+                for (int i = 0; i < w; ++i)
+                    EXPECT_EQ(got[i], RefConvert8u(ties[i], mode)) << "control " << rc << " mode " << mode << " " << i;
+            }
             ASSERT_EQ(pvxiConvert_32f8u_C1R(src, 12, dst, 3, {3, 1}, mode), pvxStsNoErr);
             EXPECT_EQ(_mm_getcsr() & 0x6000u, rc);
             ASSERT_EQ(pvxiConvert_32f8u_C1R(nullptr, 12, dst, 3, {3, 1}, mode), pvxStsNullPtrErr);
