@@ -38,6 +38,40 @@ inline VI LoadLo32(const void* p)
     std::memcpy(&x, p, 4);
     return _mm_cvtsi32_si128(x);
 }
+// The first N bytes at p (N <= 16), the rest zero, read no further than
+// p + N and gathered in general registers, so that a vector load never waits
+// on narrower stores.
+template <int N>
+inline std::uint64_t LoadBytes64(const std::uint8_t* p)
+{
+    static_assert(N >= 0 && N <= 8);
+    std::uint64_t x = 0;
+    if constexpr (N == 8) {
+        std::memcpy(&x, p, 8);
+    } else {
+        // whole 4-, 2- and 1-byte loads, put together by shifts
+        if constexpr ((N & 4) != 0) {
+            std::uint32_t t;
+            std::memcpy(&t, p, 4);
+            x = t;
+        }
+        if constexpr ((N & 2) != 0) {
+            std::uint16_t t;
+            std::memcpy(&t, p + (N & 4), 2);
+            x |= static_cast<std::uint64_t>(t) << (8 * (N & 4));
+        }
+        if constexpr ((N & 1) != 0) x |= static_cast<std::uint64_t>(p[N & 6]) << (8 * (N & 6));
+    }
+    return x;
+}
+template <int N>
+inline VI LoadPartial(const void* p)
+{
+    static_assert(N > 0 && N <= 16);
+    const auto* b = static_cast<const std::uint8_t*>(p);
+    std::uint64_t lo = LoadBytes64<(N < 8 ? N : 8)>(b), hi = LoadBytes64<(N > 8 ? N - 8 : 0)>(b + 8);
+    return _mm_set_epi64x(static_cast<long long>(hi), static_cast<long long>(lo));
+}
 template <int kLane>
 inline void Store32(void* p, VI v)
 {

@@ -397,6 +397,18 @@ struct Pattern {
         return m;
     }();
 
+    // Where each byte of the constant pattern comes from in the constant's
+    // bytes (0x80: a zero byte, the alpha units).
+    static constexpr int kValueBytes = kKeptUnits * static_cast<int>(sizeof(U));
+    static constexpr auto kValueIndex = [] {
+        std::array<std::uint8_t, (kRegs + 1) * simd::kBytes> m{};
+        for (int j = 0; j < (kRegs + 1) * simd::kBytes; ++j) {
+            int c = j / static_cast<int>(sizeof(U)) % kPixelUnits;
+            m[j] = c < kKeptUnits ? static_cast<std::uint8_t>(c * sizeof(U) + j % sizeof(U)) : 0x80;
+        }
+        return m;
+    }();
+
     // value: kProcessed<L> pixel elements, or null (no constant: cst is zero
     // and unit is never read).
     explicit Pattern(const T* value)
@@ -406,13 +418,25 @@ struct Pattern {
             cst[r] = simd::Zero();
         }
         if (!value) return;
-        const U* v = reinterpret_cast<const U*>(value);
-        for (int i = 0; i < kUnits + kLanes; ++i) {
-            int c = i % kPixelUnits;
-            unit[i] = c < kKeptUnits ? v[c] : U{};
+        if constexpr (kValueBytes <= simd::kBytes) {
+            // One byte shuffle a register of the constant's bytes: the C3
+            // 8u pattern was 64 byte stores and four failed store-to-load
+            // forwards, a third of an 8x8 MulC call.
+            const simd::VI v = simd::LoadPartial<kValueBytes>(value);
+            for (int r = 0; r <= kRegs; ++r) {
+                simd::VI c = simd::ShuffleBytes(v, simd::LoadU(kValueIndex.data() + r * simd::kBytes));
+                if (r < kRegs) cst[r] = c;
+                simd::StoreA(reinterpret_cast<std::uint8_t*>(unit) + r * simd::kBytes, c);
+            }
+        } else {
+            const U* v = reinterpret_cast<const U*>(value);
+            for (int i = 0; i < kUnits + kLanes; ++i) {
+                int c = i % kPixelUnits;
+                unit[i] = c < kKeptUnits ? v[c] : U{};
+            }
+            for (int r = 0; r < kRegs; ++r)
+                cst[r] = simd::LoadA(reinterpret_cast<const std::uint8_t*>(unit) + r * simd::kBytes);
         }
-        for (int r = 0; r < kRegs; ++r)
-            cst[r] = simd::LoadA(reinterpret_cast<const std::uint8_t*>(unit) + r * simd::kBytes);
     }
 
     // The constant and alpha mask of a register starting at unit s of a row.
