@@ -1,7 +1,8 @@
 // Small regions: a 1080p frame processed as 8x8 tiles, one call a tile (32400
 // calls), as block-based codecs and tiled pipelines call the library. What
 // these cases time is mostly the cost of a call: checks, per-call set-up
-// (shuffle masks, fill patterns, scale-factor constants) and row tails. The
+// (shuffle masks, fill patterns, constant patterns, scale-factor constants)
+// and row ends shorter than a block. The
 // peer works on the same tiles through matrix headers of the same regions.
 #include <opencv2/core.hpp>
 #include <opencv2/imgproc.hpp>
@@ -122,6 +123,46 @@ PVX_BENCH_CASES(TileCases)
             });
         };
         Finish(c, b, "Add_8u_C3RSfs_sf0", f);
+    }
+    {
+        // (the products are exact in single precision, so the peer's rounding
+        // of product times 1/4 is the scale-factor rule's)
+        auto b = MakeBufs(f, CV_8UC3);
+        Case c;
+        c.pvx = [b, tile] {
+            static const Pvx8u value[3] = {3, 4, 5};
+            const int as = static_cast<int>(b->a.step), ds = static_cast<int>(b->dst.step);
+            ForTiles(b->a, [&](int x, int y) {
+                pvxiMulC_8u_C3RSfs(b->a.ptr(y, x), as, value, b->dst.ptr(y, x), ds, tile, 2);
+            });
+        };
+        c.peer = [b] {
+            ForTiles(b->a, [&](int x, int y) {
+                cv::Rect r(x, y, kTile, kTile);
+                cv::Mat out = b->ref(r);
+                cv::multiply(b->a(r), cv::Scalar(3, 4, 5), out, 0.25);
+            });
+        };
+        Finish(c, b, "MulC_8u_C3RSfs_sf2", f);
+    }
+    {
+        auto b = MakeBufs(f, CV_8UC4);
+        Case c;
+        c.pvx = [b, tile] {
+            static const int order[4] = {2, 1, 0, 3};
+            const int as = static_cast<int>(b->a.step), ds = static_cast<int>(b->dst.step);
+            ForTiles(b->a, [&](int x, int y) {
+                pvxiSwapChannels_8u_C4R(b->a.ptr(y, x), as, b->dst.ptr(y, x), ds, tile, order);
+            });
+        };
+        c.peer = [b] {
+            ForTiles(b->a, [&](int x, int y) {
+                cv::Rect r(x, y, kTile, kTile);
+                cv::Mat out = b->ref(r);
+                cv::cvtColor(b->a(r), out, cv::COLOR_BGRA2RGBA);
+            });
+        };
+        Finish(c, b, "SwapChannels_8u_C4R", f);
     }
 }
 
