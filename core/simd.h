@@ -38,9 +38,8 @@ inline VI LoadLo32(const void* p)
     std::memcpy(&x, p, 4);
     return _mm_cvtsi32_si128(x);
 }
-// The first N bytes at p (N <= 16), the rest zero, read no further than
-// p + N and gathered in general registers, so that a vector load never waits
-// on narrower stores.
+// The first N bytes at p (N <= 8) as a little-endian number, from whole 4-,
+// 2- and 1-byte loads that read no further than p + N.
 template <int N>
 inline std::uint64_t LoadBytes64(const std::uint8_t* p)
 {
@@ -49,7 +48,6 @@ inline std::uint64_t LoadBytes64(const std::uint8_t* p)
     if constexpr (N == 8) {
         std::memcpy(&x, p, 8);
     } else {
-        // whole 4-, 2- and 1-byte loads, put together by shifts
         if constexpr ((N & 4) != 0) {
             std::uint32_t t;
             std::memcpy(&t, p, 4);
@@ -64,6 +62,9 @@ inline std::uint64_t LoadBytes64(const std::uint8_t* p)
     }
     return x;
 }
+// The first N bytes at p (N <= 16), the rest zero, read no further than
+// p + N and gathered in general registers, so that the vector never waits on
+// narrower stores (a vector load of bytes just stored one by one does).
 template <int N>
 inline VI LoadPartial(const void* p)
 {
