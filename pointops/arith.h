@@ -476,6 +476,16 @@ template <class Op, Src2 K, bool kAlpha>
     return v;
 }
 
+// The op on the register at unit j of a row (A: aligned loads).
+template <bool A, Src2 K, bool kAlpha, class Op, class U>
+[[gnu::always_inline]] inline simd::VI ApplyAt(const Op& o, const U* a, const U* b, const U* d, std::ptrdiff_t j,
+                                               simd::VI c, simd::VI keep)
+{
+    using namespace simd;
+    return ApplyOp<Op, K, kAlpha>(o, Load<A>(a + j), K == Src2::kImage ? Load<A>(b + j) : Zero(), c,
+                                  kAlpha ? Load<A>(d + j) : Zero(), keep);
+}
+
 // A row of n units, fewer than a register but at least kPart bytes: two parts
 // of kPart bytes, [0, h) and [n - h, n), in one register, both read before
 // either is stored. False where the op or layout does not allow it (ops of
@@ -559,9 +569,8 @@ void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const t
         if constexpr (kTail) {
             if (nv > P::kLanes && nv % P::kLanes != 0) {
                 last = nv - P::kLanes;
-                lastV = ApplyOp<Op, K, kAlpha>(o, LoadU(a + last), K == Src2::kImage ? LoadU(b + last) : Zero(),
-                                               K == Src2::kConst ? pat.CstAt(last) : Zero(),
-                                               kAlpha ? LoadU(d + last) : Zero(), P::AlphaAt(last));
+                lastV = ApplyAt<false, K, kAlpha>(o, a, b, d, last, K == Src2::kConst ? pat.CstAt(last) : Zero(),
+                                                  P::AlphaAt(last));
             }
         }
         if constexpr (HasVec4<Op> && K == Src2::kImage && P::kRegs == 1) {
@@ -586,18 +595,14 @@ void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const t
         for (; i + P::kUnits <= nv; i += P::kUnits) {
             for (int r = 0; r < P::kRegs; ++r) {
                 std::ptrdiff_t j = i + r * P::kLanes;
-                Store<A, kNt>(d + j, ApplyOp<Op, K, kAlpha>(o, Load<A>(a + j),
-                                                            K == Src2::kImage ? Load<A>(b + j) : Zero(), cst[r],
-                                                            kAlpha ? Load<A>(d + j) : Zero(), alpha[r]));
+                Store<A, kNt>(d + j, ApplyAt<A, K, kAlpha>(o, a, b, d, j, cst[r], alpha[r]));
             }
         }
         // Whole registers short of a pattern (C3: up to two) go as registers
         // too, each with its place in the pattern: a C3 row of 8 or 11 8u
         // pixels has no whole pattern at all.
         for (int r = 0; r < P::kRegs - 1 && i + P::kLanes <= nv; ++r, i += P::kLanes)
-            Store<A, kNt>(d + i, ApplyOp<Op, K, kAlpha>(o, Load<A>(a + i),
-                                                        K == Src2::kImage ? Load<A>(b + i) : Zero(), cst[r],
-                                                        kAlpha ? Load<A>(d + i) : Zero(), alpha[r]));
+            Store<A, kNt>(d + i, ApplyAt<A, K, kAlpha>(o, a, b, d, i, cst[r], alpha[r]));
         if (last >= 0) {
             StoreU(d + last, lastV);
             return;
