@@ -6,6 +6,7 @@
 
 #include <cmath>
 #include <cstdint>
+#include <cstdlib>
 #include <cstring>
 #include <limits>
 #include <random>
@@ -19,7 +20,22 @@ namespace pvxtest {
 
 using Rng = std::mt19937_64;
 
-inline Rng MakeRng(std::uint64_t seed) { return Rng(seed * 0x9E3779B97F4A7C15ull + 1); }
+// PVX_TEST_SEED=n in the environment moves every seed by n, so that long runs
+// can draw other images and shapes than the fixed ones CI replays; unset, the
+// runs are the same every time.
+inline std::uint64_t SeedOffset()
+{
+    static const std::uint64_t offset = [] {
+        const char* s = std::getenv("PVX_TEST_SEED");
+        return s ? std::strtoull(s, nullptr, 10) : 0ull;
+    }();
+    return offset;
+}
+
+inline Rng MakeRng(std::uint64_t seed)
+{
+    return Rng((seed + (SeedOffset() << 32)) * 0x9E3779B97F4A7C15ull + 1);
+}
 
 inline int RandInt(Rng& rng, int lo, int hi)  // inclusive
 {
@@ -285,7 +301,7 @@ void ForShapes(const char* member, std::uint64_t seed, int count, F&& run, int m
 {
     Rng rng = MakeRng(seed);
     for (const Shape& s : Shapes(rng, count, maxWidth)) {
-        SCOPED_TRACE(::testing::Message() << member << " seed " << seed << " width " << s.width << " height "
+        SCOPED_TRACE(::testing::Message() << member << " seed " << seed << " PVX_TEST_SEED " << SeedOffset() << " width " << s.width << " height "
                                           << s.height);
         run(s, rng);
         if (::testing::Test::HasFatalFailure()) return;
