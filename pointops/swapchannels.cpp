@@ -108,68 +108,43 @@ struct SwapPlan {
 };
 
 // Reorders `width` pixels of Cin channels into Cout channels, 16 / E pixels a
-// step; kept channels are blended back from the destination. Every block is
-// loaded before it is stored, and the scalar tail reads a whole pixel before
-// writing it, so src == dst works in place when the pixel size stays or
-// shrinks. A: both rows
-// 16-byte aligned; kNt: the destination row is aligned and blocks are
-// streamed (every block starts a multiple of 16 bytes into the row).
+// step; kept channels are blended back from the destination. The fewer than
+// 16 / E pixels left go as one more block, read and written in registers up
+// to the row's end (they had gone a pixel at a time, about 2 ns a pixel: the
+// 8 pixels left of a 24-pixel 8u row took longer than the block before
+// them). Every block is loaded before it is stored, so src == dst works in
+// place when the pixel size stays or shrinks. A: both rows 16-byte aligned;
+// kNt: the destination row is aligned and blocks are streamed (every block
+// starts a multiple of 16 bytes into the row).
 template <int E, int Cin, int Cout, bool kKeepAny, bool A, bool kNt = false>
-void SwapRow(const std::uint8_t* src, std::uint8_t* dst, std::ptrdiff_t width, const SwapPlan<E, Cin, Cout>& plan,
-             const int* ord)
+void SwapRow(const std::uint8_t* src, std::uint8_t* dst, std::ptrdiff_t width, const SwapPlan<E, Cin, Cout>& plan)
 {
     using Geo = ReorderGeometry<E, Cin, Cout>;
     constexpr int P = Geo::kPixels;
-    // Four-channel pixels never straddle a register, so what the blocks
-    // leave goes a register at a time, and the rest as one more register
-    // ending at the row's end, over pixels already done: its source is read
-    // before anything is stored, which keeps it right in place. (An 8x8 C4
-    // 8u tile had been all scalar.)
-    constexpr bool kByRegister = Cin == 4 && Cout == 4;
-    constexpr int R = 16 / (4 * E);  // pixels a register
-    std::ptrdiff_t last = -1;
-    VI lastIn = Zero(), lastOut = Zero();
-    if constexpr (kByRegister) {
-        if (width > R && width % R != 0) {
-            last = width - R;
-            lastIn = LoadU(src + last * Cin * E);
-            if constexpr (kKeepAny) lastOut = LoadU(dst + last * Cout * E);
-        }
-    }
+    auto block = [&](const VI* in, const VI* old, VI* out) {
+        ShuffleBlock<Geo>(in, out, plan.shuffle);
+        if constexpr (kKeepAny)
+            for (int k = 0; k < Cout; ++k) out[k] = SelectBytes(out[k], old[k], plan.keep[k]);
+    };
     std::ptrdiff_t x = 0;
     for (; x + P <= width; x += P) {
         const std::uint8_t* s = src + x * Cin * E;
         std::uint8_t* d = dst + x * Cout * E;
-        VI in[Cin], out[Cout];
+        VI in[Cin], old[Cout], out[Cout];
         for (int j = 0; j < Cin; ++j) in[j] = Load<A>(s + 16 * j);
-        ShuffleBlock<Geo>(in, out, plan.shuffle);
         if constexpr (kKeepAny)
-            for (int k = 0; k < Cout; ++k) out[k] = SelectBytes(out[k], Load<A>(d + 16 * k), plan.keep[k]);
+            for (int k = 0; k < Cout; ++k) old[k] = Load<A>(d + 16 * k);
+        block(in, old, out);
         for (int k = 0; k < Cout; ++k) Store<A, kNt>(d + 16 * k, out[k]);
     }
-    if constexpr (kByRegister) {
-        // register k of a block has the masks of every register
-        auto one = [&](VI in, VI old) {
-            VI out = ShuffleOne<Geo, 0>(&in, plan.shuffle);
-            if constexpr (kKeepAny) out = SelectBytes(out, old, plan.keep[0]);
-            return out;
-        };
-        for (; x + R <= width; x += R) {
-            std::uint8_t* d = dst + x * Cout * E;
-            Store<A, kNt>(d, one(Load<A>(src + x * Cin * E), kKeepAny ? Load<A>(d) : Zero()));
-        }
-        if (last >= 0) {
-            StoreU(dst + last * Cout * E, one(lastIn, lastOut));
-            return;
-        }
-    }
-    for (; x < width; ++x) {
-        std::uint8_t px[4 * E];
-        std::memcpy(px, src + x * Cin * E, Cin * E);
-        std::uint8_t* d = dst + x * Cout * E;
-        for (int c = 0; c < Cout; ++c)
-            if (ord[c] != kKeep) MoveElem<E>(d + c * E, px + ord[c] * E);
-    }
+    if (x == width) return;
+    const std::ptrdiff_t n = width - x;
+    std::uint8_t* d = dst + x * Cout * E;
+    VI in[Cin], old[Cout], out[Cout];
+    LoadRow<Cin>(src + x * Cin * E, n * Cin * E, in);
+    if constexpr (kKeepAny) LoadRow<Cout>(d, n * Cout * E, old);
+    block(in, old, out);
+    StoreRow<Cout>(d, n * Cout * E, out);
 }
 
 // C3C4 on one buffer: the destination pixels are wider than the source
@@ -178,15 +153,15 @@ void SwapRow(const std::uint8_t* src, std::uint8_t* dst, std::ptrdiff_t width, c
 // already done. (C4C3 narrows: left to right, a block never writes over
 // source that is still to be read, so SwapRow serves it as it is.)
 template <int E, int Cin, int Cout>
-void SwapRowWidening(std::uint8_t* row, std::ptrdiff_t width, const SwapPlan<E, Cin, Cout>& plan, const int* ord)
+void SwapRowWidening(std::uint8_t* row, std::ptrdiff_t width, const SwapPlan<E, Cin, Cout>& plan)
 {
     constexpr std::ptrdiff_t kChunk = 256;
     alignas(16) std::uint8_t aside[kChunk * Cin * E];
     for (std::ptrdiff_t end = width; end > 0;) {
         std::ptrdiff_t x = end > kChunk ? end - kChunk : 0;
         std::memcpy(aside, row + x * Cin * E, static_cast<std::size_t>((end - x) * Cin * E));
-        if (plan.anyKeep) SwapRow<E, Cin, Cout, true, false>(aside, row + x * Cout * E, end - x, plan, ord);
-        else SwapRow<E, Cin, Cout, false, false>(aside, row + x * Cout * E, end - x, plan, ord);
+        if (plan.anyKeep) SwapRow<E, Cin, Cout, true, false>(aside, row + x * Cout * E, end - x, plan);
+        else SwapRow<E, Cin, Cout, false, false>(aside, row + x * Cout * E, end - x, plan);
         end = x;
     }
 }
@@ -213,20 +188,20 @@ void RunSwap(const std::uint8_t* src, std::ptrdiff_t srcStep, std::uint8_t* dst,
         std::uint8_t* d = dst + dstStep * y;
         if constexpr (Cin < Cout) {
             if (s == d) {
-                SwapRowWidening<E, Cin, Cout>(d, width, plan, ord);
+                SwapRowWidening<E, Cin, Cout>(d, width, plan);
                 continue;
             }
         }
         bool aligned = IsAligned(s) && IsAligned(d);
         if (stream && IsAligned(d)) {
-            if (aligned) SwapRow<E, Cin, Cout, false, true, true>(s, d, width, plan, ord);
-            else SwapRow<E, Cin, Cout, false, false, true>(s, d, width, plan, ord);
+            if (aligned) SwapRow<E, Cin, Cout, false, true, true>(s, d, width, plan);
+            else SwapRow<E, Cin, Cout, false, false, true>(s, d, width, plan);
         } else if (plan.anyKeep) {
-            if (aligned) SwapRow<E, Cin, Cout, true, true>(s, d, width, plan, ord);
-            else SwapRow<E, Cin, Cout, true, false>(s, d, width, plan, ord);
+            if (aligned) SwapRow<E, Cin, Cout, true, true>(s, d, width, plan);
+            else SwapRow<E, Cin, Cout, true, false>(s, d, width, plan);
         } else {
-            if (aligned) SwapRow<E, Cin, Cout, false, true>(s, d, width, plan, ord);
-            else SwapRow<E, Cin, Cout, false, false>(s, d, width, plan, ord);
+            if (aligned) SwapRow<E, Cin, Cout, false, true>(s, d, width, plan);
+            else SwapRow<E, Cin, Cout, false, false>(s, d, width, plan);
         }
     }
     if (stream) StoreFence();
