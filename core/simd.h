@@ -277,6 +277,8 @@ inline VI ShiftUpBytes(VI v, std::ptrdiff_t a) { return ShuffleBytes(v, LoadU(kS
 {
     const auto* b = static_cast<const std::uint8_t*>(p);
     if (n == 16) return LoadU(b);
+    if (n == 8) return LoadLo64(b);
+    if (n == 4) return LoadLo32(b);
     if (n >= 8) return Or(LoadLo64(b), ShiftUpBytes(LoadLo64(b + n - 8), n - 8));
     if (n >= 4) return Or(LoadLo32(b), ShiftUpBytes(LoadLo32(b + n - 4), n - 4));
     int x = b[0];
@@ -290,6 +292,8 @@ inline VI ShiftUpBytes(VI v, std::ptrdiff_t a) { return ShuffleBytes(v, LoadU(kS
 {
     auto* b = static_cast<std::uint8_t*>(p);
     if (n == 16) return StoreU(b, v);
+    if (n == 8) return StoreLo64(b, v);
+    if (n == 4) return Store32<0>(b, v);
     if (n >= 8) {
         StoreLo64(b, v);
         StoreLo64(b + n - 8, ShiftDownBytes(v, n - 8));

@@ -122,9 +122,7 @@ struct Replicate {
 // (streamed) with no loss at 1080p. Splitting into planes ties as well and
 // keeps the shuffles and ORs, which measured up to 1.2 times faster there.
 // Other ties go to kOrShuffles. direct marks an output that is input o unchanged
-// (channel blends); keep marks the destination bytes that are kept. tail
-// lists the elements of pixel 0 (stream and offset on each side) for the
-// scalar tail.
+// (channel blends); keep marks the destination bytes that are kept.
 enum class Plan { kOrShuffles, kShuffleBlend };
 
 inline constexpr int kBlendCost = 2;  // pshufb and por count one
@@ -139,10 +137,6 @@ struct MoveTable {
     bool keeps[4];
     bool sharedUsed[4];
     Plan plan;
-    struct Elem {
-        int os, ob, is, ib;
-    } tail[16];
-    int nTail;
 };
 
 template <class M>
@@ -197,48 +191,11 @@ constexpr MoveTable BuildMoveTable()
         t.plan = Plan::kShuffleBlend;
     else t.plan = Plan::kOrShuffles;
 
-    // pixel 0: output elements and the input elements they take
-    int n = 0;
-    int outStreams = M::kOutPlanar ? M::kOut : 1;
-    int perStream = M::kOutPlanar ? M::kS : M::kOutPix;
-    for (int os = 0; os < outStreams; ++os) {
-        for (int ob = 0; ob < perStream; ob += M::kS) {
-            int g = M::kOutPlanar ? os * 16 + ob : ob;
-            int s = M::Src(g);
-            if (s < 0) continue;
-            int is = M::kInPlanar ? s / 16 : 0;
-            int ib = M::kInPlanar ? s % 16 : s;
-            t.tail[n++] = {os, ob, is, ib};
-        }
-    }
-    t.nTail = n;
     return t;
 }
 
 template <class M>
 inline constexpr MoveTable kMoveTable = BuildMoveTable<M>();
-
-template <int S>
-inline void CopyElem(Byte* d, const Byte* s)
-{
-    std::memcpy(d, s, S);
-}
-
-// Pixels [x0, x1) one element at a time. kConst: the input is a pattern of
-// one pixel (pat holds the bytes of pixel 0 of every input stream).
-template <class M, bool kConst>
-inline void MoveScalar(const Byte* const* in, Byte* const* out, std::ptrdiff_t x0, std::ptrdiff_t x1,
-                       const Byte* pat)
-{
-    constexpr const MoveTable& T = kMoveTable<M>;
-    for (std::ptrdiff_t x = x0; x < x1; ++x) {
-        for (int k = 0; k < T.nTail; ++k) {
-            const MoveTable::Elem& e = T.tail[k];
-            const Byte* s = kConst ? pat + e.ib : in[e.is] + x * M::kInPix + e.ib;
-            CopyElem<M::kS>(out[e.os] + x * M::kOutPix + e.ob, s);
-        }
-    }
-}
 
 // Four channels to four planes and back as a 4x4 transpose of 32-bit lanes:
 // within a 16-byte vector of interleaved pixels, group[] gathers each
@@ -270,19 +227,13 @@ struct QuadTable {
 template <int S>
 inline constexpr QuadTable<S> kQuadTable{};
 
-// One block of N pixels at pixel x: loads every input vector, builds every
-// output vector by shuffles (or takes it unchanged), blends in the kept
-// destination bytes, and stores. Always inlined: a call per block, which the
-// compiler chose once rows ran four blocks a step, halved the speed.
-template <class M, bool kConst, bool kStream>
-[[gnu::always_inline]] inline void MoveBlock(const Byte* const* in, Byte* const* out, std::ptrdiff_t x, const VI* pat)
+// The output vectors of one block from its input vectors: shuffles, or the
+// input unchanged, or the four-channel transpose (which works on v in
+// place). Kept destination bytes are blended in by the caller.
+template <class M>
+[[gnu::always_inline]] inline void BuildBlock(VI* v, VI* r)
 {
     constexpr const MoveTable& T = kMoveTable<M>;
-    VI v[M::kIn];
-    for (int q = 0; q < M::kIn; ++q) {
-        if constexpr (kConst) v[q] = pat[q];
-        else v[q] = LoadU(M::kInPlanar ? in[q] + x * M::kS : in[0] + x * M::kInPix + 16 * q);
-    }
     if constexpr (IsQuad<M>()) {
         constexpr const QuadTable<M::kS>& Q = kQuadTable<M::kS>;
         if constexpr (!M::kInPlanar && M::kS < 4)
@@ -290,10 +241,7 @@ template <class M, bool kConst, bool kStream>
         Transpose4x32(v[0], v[1], v[2], v[3]);
         if constexpr (M::kInPlanar && M::kS < 4)
             for (int q = 0; q < 4; ++q) v[q] = ShuffleBytes(v[q], LoadA(Q.ungroup));
-        for (int o = 0; o < 4; ++o) {
-            Byte* d = M::kOutPlanar ? out[o] + x * M::kS : out[0] + x * M::kOutPix + 16 * o;
-            Store<false, kStream>(d, v[o]);
-        }
+        for (int o = 0; o < 4; ++o) r[o] = v[o];
         return;
     }
     VI sh[M::kIn];
@@ -301,23 +249,97 @@ template <class M, bool kConst, bool kStream>
         for (int q = 0; q < M::kIn; ++q)
             if (T.sharedUsed[q]) sh[q] = ShuffleBytes(v[q], LoadA(T.shared[q]));
     for (int o = 0; o < M::kOut; ++o) {
-        Byte* d = M::kOutPlanar ? out[o] + x * M::kS : out[0] + x * M::kOutPix + 16 * o;
-        VI r = Zero();
+        r[o] = Zero();
         if (T.direct[o]) {
-            r = v[o];
+            r[o] = v[o];
         } else if (T.plan == Plan::kShuffleBlend) {
             bool first = true;
             for (int q = 0; q < M::kIn; ++q) {
                 if (!T.used[o][q]) continue;
-                r = first ? sh[q] : SelectBytes(r, sh[q], LoadA(T.sel[o][q]));
+                r[o] = first ? sh[q] : SelectBytes(r[o], sh[q], LoadA(T.sel[o][q]));
                 first = false;
             }
         } else {
             for (int q = 0; q < M::kIn; ++q)
-                if (T.used[o][q]) r = Or(r, ShuffleBytes(v[q], LoadA(T.idx[o][q])));
+                if (T.used[o][q]) r[o] = Or(r[o], ShuffleBytes(v[q], LoadA(T.idx[o][q])));
         }
-        if (T.keeps[o]) r = SelectBytes(r, LoadU(d), LoadA(T.keep[o]));
-        Store<false, kStream>(d, r);
+    }
+}
+
+// One block of N pixels at pixel x: loads every input vector, builds every
+// output vector, blends in the kept destination bytes, and stores. Always
+// inlined: a call per block, which the compiler chose once rows ran four
+// blocks a step, halved the speed.
+template <class M, bool kConst, bool kStream>
+[[gnu::always_inline]] inline void MoveBlock(const Byte* const* in, Byte* const* out, std::ptrdiff_t x, const VI* pat)
+{
+    constexpr const MoveTable& T = kMoveTable<M>;
+    VI v[M::kIn], r[M::kOut];
+    for (int q = 0; q < M::kIn; ++q) {
+        if constexpr (kConst) v[q] = pat[q];
+        else v[q] = LoadU(M::kInPlanar ? in[q] + x * M::kS : in[0] + x * M::kInPix + 16 * q);
+    }
+    BuildBlock<M>(v, r);
+    for (int o = 0; o < M::kOut; ++o) {
+        Byte* d = M::kOutPlanar ? out[o] + x * M::kS : out[0] + x * M::kOutPix + 16 * o;
+        if (T.keeps[o]) r[o] = SelectBytes(r[o], LoadU(d), LoadA(T.keep[o]));
+        Store<false, kStream>(d, r[o]);
+    }
+}
+
+// Bytes of n pixels of a stream of pixels of kPix bytes; a stream whose
+// pointer is at one channel of its pixels (kShort maps) ends with that
+// channel.
+template <class M, int kPix>
+constexpr std::ptrdiff_t StreamBytes(std::ptrdiff_t n)
+{
+    return M::kShort ? (n - 1) * kPix + M::kS : n * kPix;
+}
+
+// Pixels [x, x + n) as one block read and written in registers up to the
+// ends of the streams, with nothing outside them touched: 0 < n <= N (the
+// last pixel of a kShort row included). Rows' ends and rows shorter than a
+// block went a pixel at a time, a table-driven element copy each, and an
+// 8x8 tile of 3-channel pixels split into planes took 130 ns.
+template <class M, bool kConst>
+[[gnu::always_inline]] inline void MoveShort(const Byte* const* in, Byte* const* out, std::ptrdiff_t x,
+                                             std::ptrdiff_t n, const VI* pat)
+{
+    constexpr const MoveTable& T = kMoveTable<M>;
+    VI v[M::kIn], r[M::kOut];
+    if constexpr (kConst) {
+        for (int q = 0; q < M::kIn; ++q) v[q] = pat[q];
+    } else if constexpr (M::kInPlanar) {
+        for (int q = 0; q < M::kIn; ++q) LoadRow<1>(in[q] + x * M::kS, n * M::kS, &v[q]);
+    } else {
+        LoadRow<M::kIn>(in[0] + x * M::kInPix, StreamBytes<M, M::kInPix>(n), v);
+    }
+    BuildBlock<M>(v, r);
+    if constexpr (M::kOutPlanar) {
+        for (int o = 0; o < M::kOut; ++o) {
+            Byte* d = out[o] + x * M::kS;
+            if (T.keeps[o]) {
+                VI old;
+                LoadRow<1>(d, n * M::kS, &old);
+                r[o] = SelectBytes(r[o], old, LoadA(T.keep[o]));
+            }
+            StoreRow<1>(d, n * M::kS, &r[o]);
+        }
+    } else {
+        Byte* d = out[0] + x * M::kOutPix;
+        const std::ptrdiff_t bytes = StreamBytes<M, M::kOutPix>(n);
+        constexpr bool kAnyKeep = [] {
+            for (int o = 0; o < M::kOut; ++o)
+                if (kMoveTable<M>.keeps[o]) return true;
+            return false;
+        }();
+        if constexpr (kAnyKeep) {
+            VI old[M::kOut];
+            LoadRow<M::kOut>(d, bytes, old);
+            for (int o = 0; o < M::kOut; ++o)
+                if (T.keeps[o]) r[o] = SelectBytes(r[o], old[o], LoadA(T.keep[o]));
+        }
+        StoreRow<M::kOut>(d, bytes, r);
     }
 }
 
@@ -358,12 +380,12 @@ template <class M, bool kConst, bool kStream>
     return x;
 }
 
-// Moves w pixels of one row. kNt: stream the output (non-temporal stores)
-// where the output streams can be aligned; the unaligned head and the tail go
-// through the scalar path, and the caller fences after its last row.
+// Moves w pixels of one row: whole blocks, then what they leave as one short
+// block. kNt: stream the output (non-temporal stores) where the output
+// streams can be aligned; the unaligned head and the tail are ordinary
+// stores, and the caller fences after its last row.
 template <class M, bool kConst = false, bool kNt = false>
-void MoveRow(const Byte* const* inStreams, Byte* const* outStreams, std::ptrdiff_t w, const VI* pat = nullptr,
-             const Byte* patBytes = nullptr)
+void MoveRow(const Byte* const* inStreams, Byte* const* outStreams, std::ptrdiff_t w, const VI* pat = nullptr)
 {
     // Local copies: stores through the rows cannot alias them, so the
     // pointers stay in registers.
@@ -378,14 +400,14 @@ void MoveRow(const Byte* const* inStreams, Byte* const* outStreams, std::ptrdiff
     if constexpr (kNt) {
         std::ptrdiff_t h = StreamStart<M>(out);
         if (h >= 0 && h + kN <= end) {
-            MoveScalar<M, kConst>(in, out, 0, h, patBytes);
+            if (h > 0) MoveShort<M, kConst>(in, out, 0, h, pat);
             x = MoveBlocks<M, kConst, true>(in, out, h, end, pat);
-            MoveScalar<M, kConst>(in, out, x, w, patBytes);
+            if (x < w) MoveShort<M, kConst>(in, out, x, w - x, pat);
             return;
         }
     }
     x = MoveBlocks<M, kConst, false>(in, out, x, end, pat);
-    MoveScalar<M, kConst>(in, out, x, w, patBytes);
+    if (x < w) MoveShort<M, kConst>(in, out, x, w - x, pat);
 }
 
 // The input vectors of one block when the input is a pixel pattern: byte j of

@@ -101,8 +101,8 @@ void BlendRows(const T* value, int k, Byte* dst, int dstStep, PvxiSize roi)
     Byte* out[1];
     for (int y = 0; y < rows; ++y) {
         out[0] = RowAt(dst, dstStep, y);
-        if (nt) move::MoveRow<M, true, true>(nullptr, out, w, pat, pix.bytes);
-        else move::MoveRow<M, true>(nullptr, out, w, pat, pix.bytes);
+        if (nt) move::MoveRow<M, true, true>(nullptr, out, w, pat);
+        else move::MoveRow<M, true>(nullptr, out, w, pat);
     }
     if (nt) StoreFence();
 }
