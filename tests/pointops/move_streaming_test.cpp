@@ -88,10 +88,11 @@ void MirrorLarge(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int), bool al
                                               << w << "x" << h << " flip " << flip << " aligned " << aligned);
             ShapeOptions o{!aligned, !aligned, false, 0};
             GuardedImage src = MakeImage<T>(w, h, 4, rng, o), dst = MakeImage<T>(w, h, 4, rng, o);
+            const auto dstBefore = dst.Packed<T>();  // AC4 keeps its alpha
             SmallCache cache(kCache);
             ASSERT_EQ(fn(src.ptr<T>(), src.step(), dst.ptr<T>(), dst.step(), {w, h}, flip), pvxStsNoErr);
             EXPECT_GT(gCacheQueries.load(), 0);
-            EXPECT_TRUE(RegionEquals(dst, RefMirror(src.Packed<T>(), dst.Packed<T>(), w, h, 4, alpha, flip)));
+            EXPECT_TRUE(RegionEquals(dst, RefMirror(src.Packed<T>(), dstBefore, w, h, 4, alpha, flip)));
         }
 }
 
