@@ -72,12 +72,11 @@ inline PvxStatus TransposeC1(const Pvx32f* s, int ss, Pvx32f* d, int ds, PvxiSiz
     return body::pvxiTranspose_32f_C1R(s, ss, d, ds, r);
 }
 
-// Pixel of C channels of E bytes; AC4 (kAlpha) moves the first three only.
+// Pixel of C channels of E bytes (AC4 members blend the fourth back).
 // A reversal block is four vectors, or three when a pixel does not divide 16.
 template <int E, int C, bool kAlpha>
 struct Pixel {
     static constexpr int kSize = C * E;
-    static constexpr int kMoved = kAlpha ? 3 * E : kSize;
     static constexpr int kVectors = 16 % kSize == 0 ? 4 : 3;
     static constexpr int kBlock = 16 * kVectors / kSize;  // pixels
     using Geo = ReverseGeometry<kSize, kVectors>;
@@ -105,14 +104,6 @@ struct Pixel {
         return plan;
     }
     static VI AlphaMask() { return LoadU(kAlphaBytes.data()); }
-    static void Move(Bytes* d, const Bytes* s) { std::memcpy(d, s, kMoved); }
-    static void Exchange(Bytes* a, Bytes* b)
-    {
-        Bytes t[kMoved];
-        std::memcpy(t, a, kMoved);
-        std::memcpy(a, b, kMoved);
-        std::memcpy(b, t, kMoved);
-    }
 };
 
 enum StoreKind { kUnaligned, kAligned, kStream };
@@ -144,10 +135,10 @@ void CopyRow(const Bytes* s, Bytes* d, std::ptrdiff_t n, VI alpha)
             Put<S>(d + i + 48, e);
         }
         for (; i + 16 <= n; i += 16) Put<S>(d + i, LoadU(s + i));
-        if (i < n) std::memcpy(d + i, s + i, n - i);
+        if (i < n) StoreShort(d + i, n - i, LoadShort(s + i, n - i));
     } else {
         for (; i + 16 <= n; i += 16) Put<S>(d + i, SelectBytes(LoadU(s + i), LoadU(d + i), alpha));
-        for (; i < n; i += Px::kSize) Px::Move(d + i, s + i);
+        if (i < n) StoreShort(d + i, n - i, SelectBytes(LoadShort(s + i, n - i), LoadShort(d + i, n - i), alpha));
     }
 }
 
@@ -178,9 +169,29 @@ void CopyRowPair(const Bytes* s0, Bytes* d0, const Bytes* s1, Bytes* d1, std::pt
     }
 }
 
+// n pixels of a block or fewer, reversed from s to d in registers: read into
+// the top of a block, so that the reversed block has them at its start, and
+// written up to the end of the n pixels. The pixels of rows' ends had gone
+// one at a time.
+template <class Px, bool kAlpha>
+[[gnu::always_inline]] inline void ReverseShort(const Bytes* s, Bytes* d, std::ptrdiff_t n,
+                                                const typename Px::Plan& plan, VI alpha)
+{
+    constexpr int NV = Px::kVectors;
+    VI in[NV], out[NV];
+    LoadRowHigh<NV>(s, n * Px::kSize, in);
+    ShuffleBlock<typename Px::Geo>(in, out, plan);
+    if constexpr (kAlpha) {
+        VI old[NV];
+        LoadRow<NV>(d, n * Px::kSize, old);
+        for (int k = 0; k < NV; ++k) out[k] = SelectBytes(out[k], old[k], alpha);
+    }
+    StoreRow<NV>(d, n * Px::kSize, out);
+}
+
 // Writes the pixels of a source row in reverse order (flips 1 and 2): block
 // x of the destination is the reversed block that ends width - x pixels into
-// the source; single pixels at the end.
+// the source; the fewer pixels left as one short block.
 template <class Px, bool kAlpha, int S>
 void ReverseRow(const Bytes* s, Bytes* d, std::ptrdiff_t width, const typename Px::Plan& plan, VI alpha)
 {
@@ -197,7 +208,7 @@ void ReverseRow(const Bytes* s, Bytes* d, std::ptrdiff_t width, const typename P
             Put<S>(db + 16 * k, out[k]);
         }
     }
-    for (; x < width; ++x) Px::Move(d + x * PS, s + (width - 1 - x) * PS);
+    if (x < width) ReverseShort<Px, kAlpha>(s, d + x * PS, width - x, plan, alpha);
 }
 
 // Two rows reversed at once, block by block (see CopyRowPair).
@@ -225,9 +236,9 @@ void ReverseRowPair(const Bytes* s0, Bytes* d0, const Bytes* s1, Bytes* d1, std:
             Put<S>(d1 + dof + 16 * k, out1[k]);
         }
     }
-    for (; x < width; ++x) {
-        Px::Move(d0 + x * PS, s0 + (width - 1 - x) * PS);
-        Px::Move(d1 + x * PS, s1 + (width - 1 - x) * PS);
+    if (x < width) {
+        ReverseShort<Px, kAlpha>(s0, d0 + x * PS, width - x, plan, alpha);
+        ReverseShort<Px, kAlpha>(s1, d1 + x * PS, width - x, plan, alpha);
     }
 }
 
@@ -246,10 +257,15 @@ void ExchangeRows(Bytes* a, Bytes* b, std::ptrdiff_t width, VI alpha)
             StoreU(b + i, va);
         }
     }
-    if constexpr (kAlpha) {
-        for (; i < n; i += Px::kSize) Px::Exchange(a + i, b + i);  // whole pixels: 16 is a multiple of them
-    } else {
-        for (; i < n; ++i) std::swap(a[i], b[i]);
+    if (i < n) {
+        VI va = LoadShort(a + i, n - i), vb = LoadShort(b + i, n - i);
+        if constexpr (kAlpha) {
+            StoreShort(a + i, n - i, SelectBytes(vb, va, alpha));
+            StoreShort(b + i, n - i, SelectBytes(va, vb, alpha));
+        } else {
+            StoreShort(a + i, n - i, vb);
+            StoreShort(b + i, n - i, va);
+        }
     }
 }
 
@@ -280,7 +296,21 @@ void ReverseRowInPlace(Bytes* r, std::ptrdiff_t width, const typename Px::Plan& 
             StoreU(rb + 16 * k, orr[k]);
         }
     }
-    for (std::ptrdiff_t i = x, j = width - 1 - x; i < j; ++i, --j) Px::Exchange(r + i * PS, r + j * PS);
+    // the middle, fewer than two blocks: read into the top of two blocks,
+    // each reversed into the other's place
+    const std::ptrdiff_t m = width - 2 * x;
+    if (m <= 1) return;
+    Bytes* mid = r + x * PS;
+    VI in[2 * NV], out[2 * NV];
+    LoadRowHigh<2 * NV>(mid, m * PS, in);
+    ShuffleBlock<typename Px::Geo>(in + NV, out, plan);
+    ShuffleBlock<typename Px::Geo>(in, out + NV, plan);
+    if constexpr (kAlpha) {
+        VI old[2 * NV];
+        LoadRow<2 * NV>(mid, m * PS, old);
+        for (int k = 0; k < 2 * NV; ++k) out[k] = SelectBytes(out[k], old[k], alpha);
+    }
+    StoreRow<2 * NV>(mid, m * PS, out);
 }
 
 // In place, flip 2: row a becomes row b reversed and row b becomes row a
@@ -309,7 +339,26 @@ void ExchangeReversedRows(Bytes* a, Bytes* b, std::ptrdiff_t width, const typena
             StoreU(bb + 16 * k, ob[k]);
         }
     }
-    for (; x < width; ++x) Px::Exchange(a + x * PS, b + (width - 1 - x) * PS);
+    if (x == width) return;
+    // a's last n pixels and b's first n, each the other reversed
+    const std::ptrdiff_t n = width - x, bytes = n * PS;
+    Bytes* at = a + x * PS;
+    VI ha[NV], hb[NV], oa[NV], ob[NV];
+    LoadRowHigh<NV>(at, bytes, ha);
+    LoadRowHigh<NV>(b, bytes, hb);
+    ShuffleBlock<typename Px::Geo>(hb, oa, plan);
+    ShuffleBlock<typename Px::Geo>(ha, ob, plan);
+    if constexpr (kAlpha) {
+        VI va[NV], vb[NV];
+        LoadRow<NV>(at, bytes, va);
+        LoadRow<NV>(b, bytes, vb);
+        for (int k = 0; k < NV; ++k) {
+            oa[k] = SelectBytes(oa[k], va[k], alpha);
+            ob[k] = SelectBytes(ob[k], vb[k], alpha);
+        }
+    }
+    StoreRow<NV>(at, bytes, oa);
+    StoreRow<NV>(b, bytes, ob);
 }
 
 // One destination row: streamed (8u C1 flip 0 from the first aligned byte,
