@@ -318,7 +318,7 @@ template <int K>
 {
     const auto* b = static_cast<const std::uint8_t*>(p);
     const std::ptrdiff_t full = n / 16, r = n % 16;
-#pragma GCC unroll 8
+#pragma GCC unroll 16
     for (int k = 0; k < K; ++k) {
         if (k < full) v[k] = LoadU(b + 16 * k);
         else if (k == full && r != 0) v[k] = k > 0 ? ShiftDownBytes(LoadU(b + n - 16), 16 - r) : LoadShort(b, r);
@@ -334,7 +334,7 @@ template <int K>
 [[gnu::always_inline]] inline void LoadRowHigh(const void* p, std::ptrdiff_t n, VI* v)
 {
     const auto* b = static_cast<const std::uint8_t*>(p);
-#pragma GCC unroll 8
+#pragma GCC unroll 16
     for (int k = 0; k < K; ++k) {
         const std::ptrdiff_t off = n - 16 * (K - k);  // where register k starts in the row
         if (off >= 0) v[k] = LoadU(b + off);
@@ -351,7 +351,7 @@ template <int K>
 {
     auto* b = static_cast<std::uint8_t*>(p);
     const std::ptrdiff_t full = n / 16, r = n % 16;
-#pragma GCC unroll 8
+#pragma GCC unroll 16
     for (int k = 0; k < K; ++k) {
         if (k < full) {
             StoreU(b + 16 * k, v[k]);

@@ -446,29 +446,40 @@ template <int S, int C, bool kAlpha>
 inline constexpr MaskTable<S, C, kAlpha> kMaskTable{};
 
 // Writes pixel x of w where its mask byte is non-zero, 16 pixels a step
-// (blocks whose mask is all zero are skipped), scalar tail. kConst: the
-// source is a pattern: pat holds the P vectors of a block, patBytes one pixel.
+// (blocks whose mask is all zero are skipped); the fewer pixels left as one
+// short block in registers, whose mask lanes past the row read as zero.
+// kConst: the source is a pattern: pat holds the P vectors of a block.
 template <int S, int C, bool kAlpha, bool kConst>
-void MaskRow(const Byte* src, Byte* dst, const Byte* mask, std::ptrdiff_t w, const VI* pat = nullptr,
-             const Byte* patBytes = nullptr)
+void MaskRow(const Byte* src, Byte* dst, const Byte* mask, std::ptrdiff_t w, const VI* pat = nullptr)
 {
     constexpr int P = C * S;
-    constexpr int kWrite = kAlpha ? 3 * S : P;
     constexpr const MaskTable<S, C, kAlpha>& T = kMaskTable<S, C, kAlpha>;
+    auto keepOf = [&](VI off, int k) {
+        VI keep = ShuffleBytes(off, LoadA(T.expand[k]));
+        if constexpr (kAlpha) keep = Or(keep, LoadA(T.alpha[k]));
+        return keep;
+    };
     std::ptrdiff_t x = 0;
     for (; x + 16 <= w; x += 16) {
         VI off = EqU8(LoadU(mask + x), Zero());  // 0xff where the pixel is left
         if (MoveMask8(off) == 0xffff) continue;
         for (int k = 0; k < P; ++k) {
             Byte* d = dst + x * P + 16 * k;
-            VI keep = ShuffleBytes(off, LoadA(T.expand[k]));
-            if constexpr (kAlpha) keep = Or(keep, LoadA(T.alpha[k]));
             VI s = kConst ? pat[k] : LoadU(src + x * P + 16 * k);
-            StoreU(d, SelectBytes(s, LoadU(d), keep));
+            StoreU(d, SelectBytes(s, LoadU(d), keepOf(off, k)));
         }
     }
-    for (; x < w; ++x)
-        if (mask[x]) std::memcpy(dst + x * P, kConst ? patBytes : src + x * P, kWrite);
+    if (x == w) return;
+    const std::ptrdiff_t n = w - x, bytes = n * P;
+    VI off = EqU8(LoadShort(mask + x, n), Zero());
+    if (MoveMask8(off) == 0xffff) return;
+    VI s[P], d[P];
+    if constexpr (kConst)
+        for (int k = 0; k < P; ++k) s[k] = pat[k];
+    else LoadRow<P>(src + x * P, bytes, s);
+    LoadRow<P>(dst + x * P, bytes, d);
+    for (int k = 0; k < P; ++k) d[k] = SelectBytes(s[k], d[k], keepOf(off, k));
+    StoreRow<P>(dst + x * P, bytes, d);
 }
 
 // The P vectors of a block of 16 pixels filled with one pixel value.

@@ -155,7 +155,7 @@ PvxStatus SetMaskArrayBody(const T* value, T* pDst, int dstStep, PvxiSize roi, c
     }
     for (int y = 0; y < rows; ++y)
         move::MaskRow<kS, kC, kKeepsAlpha<L>, true>(nullptr, reinterpret_cast<Byte*>(RowAt(pDst, dstStep, y)),
-                                                    RowAt(pMask, maskStep, y), w, pat, pix.bytes);
+                                                    RowAt(pMask, maskStep, y), w, pat);
     return pvxStsNoErr;
 }
 
