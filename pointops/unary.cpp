@@ -364,25 +364,9 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
     // likewise for the 16 bytes of 8u.
     static constexpr int kCounted = L == Lay::AC4 ? 0x7 : 0xF;
     static constexpr int kCounted8 = L == Lay::AC4 ? 0x7777 : 0xFFFF;
-    static constexpr int kCounted16 = L == Lay::AC4 ? 0x3F3F : 0xFFFF;  // bytes of 8 lanes
-    static constexpr bool k16 = sizeof(T) == 2;
-    // 16-bit elements at sf >= 0: ln x 2^-sf rounded is the number of steps
-    // that x has reached, result k from x = kSteps[sf][k - 1] on (at sf 5
-    // and above every positive x gives 0). The steps are the first input of
-    // each result of LnRound, and the exhaustive test holds them to a
-    // long-double reference on every input. Eleven compares at most in place
-    // of two logarithms: 1080p frames take 0.1 to 0.15 of the time.
-    static constexpr std::uint16_t kSteps[5][11] = {{2, 5, 13, 34, 91, 245, 666, 1809, 4915, 13360, 36316},
-                                                    {3, 21, 149, 1097, 8104, 59875},
-                                                    {8, 404, 22027},
-                                                    {55},
-                                                    {2981}};
-    static constexpr int kStepCount[5] = {11, 6, 3, 1, 1};
     int sf;
     VF scale;
     VI table[std::is_same_v<T, Pvx8u> ? 16 : 1];  // 8u: the 256 results, 16 a register
-    VI step[k16 ? 11 : 1];                         // x > step[k] (signed; 16u biased by 0x8000)
-    int steps = -1;                                // -1: single precision
     explicit LnOp(int scaleFactor) : sf(scaleFactor), scale(SplatF(Pow2F(-Bound(scaleFactor, -40, 40))))
     {
         if constexpr (std::is_same_v<T, Pvx8u>) {
@@ -390,31 +374,9 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
             for (int x = 0; x < 256; ++x) t[x] = LnRound<T>(x, sf);
             for (int h = 0; h < 16; ++h) table[h] = LoadA(t + 16 * h);
         }
-        if constexpr (k16) {
-            if (sf >= 0) {
-                steps = 0;
-                for (int k = 0; sf < 5 && k < kStepCount[sf]; ++k) {
-                    int t = kSteps[sf][k];
-                    if (t > std::numeric_limits<T>::max()) break;  // 16s: beyond its inputs
-                    int bias = std::is_signed_v<T> ? 0 : 0x8000;
-                    step[steps++] = SplatU16(static_cast<std::uint16_t>((t - 1) ^ bias));
-                }
-            }
-        }
     }
     [[gnu::always_inline]] VI Vec(VI a) const
     {
-        if constexpr (k16) {
-            if (steps >= 0) {
-                VI x = std::is_signed_v<T> ? a : Xor(a, SplatU16(0x8000));
-                VI r = Zero();
-                for (int k = 0; k < steps; ++k) r = SubI16(r, GtI16(x, step[k]));
-                VI zero = EqI16(a, Zero());
-                if (MaskBytes(zero) & kCounted16) *this->flag = true;
-                if constexpr (std::is_signed_v<T>) r = SelectBytes(r, SplatU16(0x8000), zero);
-                return r;
-            }
-        }
         if constexpr (std::is_same_v<T, Pvx8u>) {
             // 8u: one byte shuffle of each register of the table by the low
             // four bits, kept where the high four bits name that register.
@@ -465,6 +427,47 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
     }
 };
 
+// 16-bit elements at sf >= 0: ln x 2^-sf rounded is the number of steps
+// that x has reached, result k from x = kSteps[sf][k - 1] on (at sf 5 and
+// above every positive x gives 0). The steps are the first input of each
+// result of LnRound, and the exhaustive test holds them to a long-double
+// reference on every input. Eleven compares at most in place of two
+// logarithms: 1080p frames take 0.1 to 0.15 of the time. An op of its own,
+// chosen per call: a test of the scale factor in LnOp's register loop made
+// the other scale factors 17% slower.
+template <class T, Lay L>
+struct LnStepsOp : UnaryBase<LnStepsOp<T, L>, T> {
+    static_assert(sizeof(T) == 2);
+    static constexpr int kCounted = L == Lay::AC4 ? 0x3F3F : 0xFFFF;  // bytes of 8 lanes, AC4 alpha not
+    static constexpr std::uint16_t kSteps[5][11] = {{2, 5, 13, 34, 91, 245, 666, 1809, 4915, 13360, 36316},
+                                                    {3, 21, 149, 1097, 8104, 59875},
+                                                    {8, 404, 22027},
+                                                    {55},
+                                                    {2981}};
+    static constexpr int kStepCount[5] = {11, 6, 3, 1, 1};
+    VI step[11];  // x > step[k] (signed compares; 16u biased by 0x8000)
+    int steps = 0;
+    explicit LnStepsOp(int sf)
+    {
+        for (int k = 0; sf < 5 && k < kStepCount[sf]; ++k) {
+            int t = kSteps[sf][k];
+            if (t > std::numeric_limits<T>::max()) break;  // 16s: beyond its inputs
+            int bias = std::is_signed_v<T> ? 0 : 0x8000;
+            step[steps++] = SplatU16(static_cast<std::uint16_t>((t - 1) ^ bias));
+        }
+    }
+    VI Vec(VI a) const
+    {
+        VI x = std::is_signed_v<T> ? a : Xor(a, SplatU16(0x8000));
+        VI r = Zero();
+        for (int k = 0; k < steps; ++k) r = SubI16(r, GtI16(x, step[k]));
+        VI zero = EqI16(a, Zero());
+        if (MaskBytes(zero) & kCounted) *this->flag = true;
+        if constexpr (std::is_signed_v<T>) r = SelectBytes(r, SplatU16(0x8000), zero);  // ln 0: the minimum
+        return r;
+    }
+};
+
 // ---- Complement ---------------------------------------------------------------------
 
 template <class T, Lay L>
@@ -504,28 +507,39 @@ void UnderOwnRounding(Run run)
     }
 }
 
+// Runs op Op over the rows (src may be dst); a logarithm of 0 met gives the
+// division-by-zero status.
+template <class Op, class T, Lay L>
+PvxStatus RunUnary(int scaleFactor, const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
+{
+    bool met = false;
+    Op op(scaleFactor);
+    op.flag = &met;
+    UnderOwnRounding<Op>([&] { RunRows<T, L, Src2::kNone>(op, pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi); });
+    return met ? pvxStsDivByZero : pvxStsNoErr;
+}
+
+// The op of a call: Op, or LnStepsOp for Ln of 16-bit elements at sf >= 0.
+template <template <class, Lay> class Op, class T, Lay L>
+PvxStatus RunUnaryOp(int scaleFactor, const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
+{
+    if constexpr (std::is_same_v<Op<T, L>, LnOp<T, L>> && sizeof(T) == 2)
+        if (scaleFactor >= 0) return RunUnary<LnStepsOp<T, L>, T, L>(scaleFactor, pSrc, srcStep, pDst, dstStep, roi);
+    return RunUnary<Op<T, L>, T, L>(scaleFactor, pSrc, srcStep, pDst, dstStep, roi);
+}
+
 template <template <class, Lay> class Op, class T, Lay L, Order O>
 PvxStatus UnaryBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi, int scaleFactor = 0)
 {
     if (PvxStatus s = CheckFrame<O>({pSrc, pDst}, roi, {srcStep, dstStep})) return s;
-    bool met = false;
-    Op<T, L> op(scaleFactor);
-    op.flag = &met;
-    UnderOwnRounding<Op<T, L>>(
-        [&] { RunRows<T, L, Src2::kNone>(op, pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi); });
-    return met ? pvxStsDivByZero : pvxStsNoErr;
+    return RunUnaryOp<Op, T, L>(scaleFactor, pSrc, srcStep, pDst, dstStep, roi);
 }
 
 template <template <class, Lay> class Op, class T, Lay L, Order O>
 PvxStatus UnaryIBody(T* pSrcDst, int srcDstStep, PvxiSize roi, int scaleFactor = 0)
 {
     if (PvxStatus s = CheckFrame<O>({pSrcDst}, roi, {srcDstStep})) return s;
-    bool met = false;
-    Op<T, L> op(scaleFactor);
-    op.flag = &met;
-    UnderOwnRounding<Op<T, L>>(
-        [&] { RunRows<T, L, Src2::kNone>(op, pSrcDst, srcDstStep, pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi); });
-    return met ? pvxStsDivByZero : pvxStsNoErr;
+    return RunUnaryOp<Op, T, L>(scaleFactor, pSrcDst, srcDstStep, pSrcDst, srcDstStep, roi);
 }
 
 // Integer squares: the checks of this family, then the product of the image
