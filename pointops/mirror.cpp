@@ -25,8 +25,6 @@
 // width x height exceeds 2097152; four-channel members when the region is
 // larger than 512 kB and the largest cache (rows whose start is aligned).
 #include <array>
-#include <cstring>
-#include <utility>
 
 #include "check.h"
 #include "entry.h"

@@ -6,7 +6,6 @@
 #pragma once
 
 #include <cstdint>
-#include <cstring>
 #include <utility>
 
 #include "simd.h"
@@ -77,12 +76,5 @@ struct ReverseGeometry {
     static constexpr int Lo(int k) { return (kPixels - 1 - (16 * k + 15) / PS) * PS / 16; }
     static constexpr int Hi(int k) { return ((kPixels - 1 - (16 * k) / PS) * PS + PS - 1) / 16; }
 };
-
-// Moves E bytes (one element) without assuming its type or alignment.
-template <int E>
-inline void MoveElem(std::uint8_t* d, const std::uint8_t* s)
-{
-    std::memcpy(d, s, E);
-}
 
 }  // namespace pvx

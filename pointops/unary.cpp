@@ -443,13 +443,12 @@ struct LnStepsOp : UnaryBase<LnStepsOp<T, L>, T> {
                                                     {3, 21, 149, 1097, 8104, 59875},
                                                     {8, 404, 22027},
                                                     {55},
-                                                    {2981}};
-    static constexpr int kStepCount[5] = {11, 6, 3, 1, 1};
+                                                    {2981}};  // 0: no more steps
     VI step[11];  // x > step[k] (signed compares; 16u biased by 0x8000)
     int steps = 0;
     explicit LnStepsOp(int sf)
     {
-        for (int k = 0; sf < 5 && k < kStepCount[sf]; ++k) {
+        for (int k = 0; sf < 5 && k < 11 && kSteps[sf][k] != 0; ++k) {
             int t = kSteps[sf][k];
             if (t > std::numeric_limits<T>::max()) break;  // 16s: beyond its inputs
             int bias = std::is_signed_v<T> ? 0 : 0x8000;
