@@ -175,6 +175,7 @@ inline VI SllI32(VI v, VI n) { return _mm_sll_epi32(v, n); }
 inline VI SrlI32(VI v, VI n) { return _mm_srl_epi32(v, n); }
 inline VI SraI32(VI v, VI n) { return _mm_sra_epi32(v, n); }
 inline VI EqI16(VI a, VI b) { return _mm_cmpeq_epi16(a, b); }
+inline VI GtI8(VI a, VI b) { return _mm_cmpgt_epi8(a, b); }  // signed
 inline VI GtI16(VI a, VI b) { return _mm_cmpgt_epi16(a, b); }  // signed
 inline VI AbsI16(VI a) { return _mm_abs_epi16(a); }
 inline VI MaxU16(VI a, VI b) { return _mm_max_epu16(a, b); }

@@ -432,9 +432,7 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
 // above every positive x gives 0). The steps are the first input of each
 // result of LnRound, and the exhaustive test holds them to a long-double
 // reference on every input. Eleven compares at most in place of two
-// logarithms: 1080p frames take 0.1 to 0.15 of the time. An op of its own,
-// chosen per call: a test of the scale factor in LnOp's register loop made
-// the other scale factors 17% slower.
+// logarithms: 1080p frames take 0.1 to 0.15 of the time.
 template <class T, Lay L>
 struct LnStepsOp : UnaryBase<LnStepsOp<T, L>, T> {
     static_assert(sizeof(T) == 2);
@@ -467,6 +465,86 @@ struct LnStepsOp : UnaryBase<LnStepsOp<T, L>, T> {
     }
 };
 
+// ---- 8u results of few values -------------------------------------------------------
+
+// Sqrt and Ln of 8u take few values at most scale factors (0 to 16 for Sqrt
+// at sf 0, 0 to 6 for Ln at sf 0), and both never decrease with x. Their
+// result is then the number of steps x has reached: two operations a step,
+// where the square roots took four float roots a register and the logarithm
+// table four operations for each of its sixteen registers. On 1080p frames
+// Sqrt at sf 0 takes 0.4 of the time, Ln at sf 0 0.25 and at sf -2 0.7. The
+// steps come from the same rules as the other paths, which the exhaustive
+// test holds them to.
+struct Steps8 {
+    static constexpr int kMax = 24;
+    int at[kMax];  // x >= at[k] adds one; a step repeats where the result jumps by more
+    int n = 0;
+    bool Add(int x)
+    {
+        if (n == kMax) return false;
+        at[n++] = x;
+        return true;
+    }
+};
+
+// round(sqrt(x) 2^-sf) >= k where sqrt(x) >= (k - 1/2) 2^sf, that is 4x >= b
+// with b = (2k - 1)^2 4^sf. At 4x == b (sf >= 1) the value is a tie, which
+// goes to the even one of k - 1 and k.
+inline bool SqrtSteps8(int sf, Steps8& s)
+{
+    if (sf < 0) return false;  // results up to 255: the float path
+    for (std::int64_t k = 1; sf <= 4; ++k) {
+        std::int64_t b = (2 * k - 1) * (2 * k - 1) << (2 * sf);
+        std::int64_t x = (b + 3) / 4;
+        if (b % 4 == 0 && k % 2 == 1) ++x;
+        if (x > 255) break;
+        if (!s.Add(static_cast<int>(x))) return false;
+    }
+    return true;  // sf above 4: every result is 0
+}
+
+// Step k is the first x that LnRound takes to k or above. The guess, the
+// ceiling of e^((k - 1/2) 2^sf), is that x unless e^(...) lies within the
+// rounding of log and exp of an integer; the walks make it exact either way.
+inline bool LnSteps8(int sf, Steps8& s)
+{
+    int top = LnRound<Pvx8u>(255, sf);
+    if (top > Steps8::kMax) return false;
+    for (int k = 1; k <= top; ++k) {
+        double g = std::ceil(std::exp(std::ldexp(k - 0.5, Bound(sf, -40, 40))));
+        int x = g < 1 ? 1 : g > 255 ? 255 : static_cast<int>(g);
+        while (x > 1 && LnRound<Pvx8u>(x - 1, sf) >= k) --x;
+        while (LnRound<Pvx8u>(x, sf) < k) ++x;  // ends by 255, whose result is top
+        s.Add(x);
+    }
+    return true;
+}
+
+template <int K, Lay L, bool kLn>
+    requires(K % 4 == 0)
+struct Steps8Op : UnaryBase<Steps8Op<K, L, kLn>, Pvx8u> {
+    static constexpr int kCounted8 = L == Lay::AC4 ? 0x7777 : 0xFFFF;  // ln 0 in these bytes counts
+    // Step t as (t - 1) ^ 0x80: x has reached it where x ^ 0x80 is above it in
+    // a signed compare. Unused steps are 0x7F, above every x.
+    VI at[K];
+    explicit Steps8Op(const Steps8& s)
+    {
+        for (int k = 0; k < K; ++k)
+            at[k] = SplatU8(static_cast<std::uint8_t>(k < s.n ? (s.at[k] - 1) ^ 0x80 : 0x7F));
+    }
+    VI Vec(VI a) const
+    {
+        // Four sums, unrolled: one sum took a cycle a step, and a rolled loop
+        // three, twice the time of the table at 24 steps.
+        VI x = Xor(a, SplatU8(0x80)), r[4] = {Zero(), Zero(), Zero(), Zero()};
+#pragma GCC unroll 32
+        for (int k = 0; k < K; ++k) r[k % 4] = SubI8(r[k % 4], GtI8(x, at[k]));
+        if constexpr (kLn)
+            if (MaskBytes(EqU8(a, Zero())) & kCounted8) *this->flag = true;
+        return AddI8(AddI8(r[0], r[1]), AddI8(r[2], r[3]));
+    }
+};
+
 // ---- Complement ---------------------------------------------------------------------
 
 template <class T, Lay L>
@@ -490,41 +568,58 @@ struct ComplementOp {
 
 // ---- checked bodies -------------------------------------------------------------------
 
-// Exp and Ln run under round-to-nearest without flushing, whatever the
-// caller set, so that their results do not depend on it.
-template <class Op>
-concept NeedsNearest = requires { Op::kNearest; };
-
-template <class Op, class Run>
-void UnderOwnRounding(Run run)
-{
-    if constexpr (NeedsNearest<Op>) {
-        FpGuard nearest(FpRound::kNearest);
-        run();
-    } else {
-        run();
-    }
-}
-
-// Runs op Op over the rows (src may be dst); a logarithm of 0 met gives the
+// Runs op over the rows (src may be dst); a logarithm of 0 met gives the
 // division-by-zero status.
-template <class Op, class T, Lay L>
-PvxStatus RunUnary(int scaleFactor, const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
+template <class T, Lay L, class Op>
+PvxStatus RunUnary(Op op, const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
 {
     bool met = false;
-    Op op(scaleFactor);
     op.flag = &met;
-    UnderOwnRounding<Op>([&] { RunRows<T, L, Src2::kNone>(op, pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi); });
+    RunRows<T, L, Src2::kNone>(op, pSrc, srcStep, pSrc, srcStep, pDst, dstStep, roi);
     return met ? pvxStsDivByZero : pvxStsNoErr;
 }
 
-// The op of a call: Op, or LnStepsOp for Ln of 16-bit elements at sf >= 0.
+// Steps8Op with room for the steps of s.
+template <class T, Lay L, bool kLn>
+PvxStatus RunSteps8(const Steps8& s, const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
+{
+    if (s.n <= 8) return RunUnary<T, L>(Steps8Op<8, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
+    if (s.n <= 16) return RunUnary<T, L>(Steps8Op<16, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
+    return RunUnary<T, L>(Steps8Op<Steps8::kMax, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
+}
+
+// Exp and Ln build their tables and steps, and run, under round-to-nearest
+// without flushing, whatever the caller set, so that their results do not
+// depend on it.
+template <class Op>
+concept NeedsNearest = requires { Op::kNearest; };
+
+// The op of a call: Op, or one that counts steps where the results take few
+// values (Ln of 16-bit elements at sf >= 0, Sqrt of 8u at sf >= 0, Ln of 8u
+// at sf >= -2). Ops of their own, chosen per call: a test of the scale
+// factor in LnOp's register loop made the other scale factors 17% slower.
 template <template <class, Lay> class Op, class T, Lay L>
 PvxStatus RunUnaryOp(int scaleFactor, const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
 {
-    if constexpr (std::is_same_v<Op<T, L>, LnOp<T, L>> && sizeof(T) == 2)
-        if (scaleFactor >= 0) return RunUnary<LnStepsOp<T, L>, T, L>(scaleFactor, pSrc, srcStep, pDst, dstStep, roi);
-    return RunUnary<Op<T, L>, T, L>(scaleFactor, pSrc, srcStep, pDst, dstStep, roi);
+    constexpr bool kLn = std::is_same_v<Op<T, L>, LnOp<T, L>>;
+    constexpr bool kSqrt = std::is_same_v<Op<T, L>, SqrtOp<T, L>>;
+    auto run = [&]() -> PvxStatus {
+        if constexpr (kLn && sizeof(T) == 2)
+            if (scaleFactor >= 0)
+                return RunUnary<T, L>(LnStepsOp<T, L>(scaleFactor), pSrc, srcStep, pDst, dstStep, roi);
+        if constexpr ((kLn || kSqrt) && std::is_same_v<T, Pvx8u>) {
+            Steps8 s;
+            if (kLn ? LnSteps8(scaleFactor, s) : SqrtSteps8(scaleFactor, s))
+                return RunSteps8<T, L, kLn>(s, pSrc, srcStep, pDst, dstStep, roi);
+        }
+        return RunUnary<T, L>(Op<T, L>(scaleFactor), pSrc, srcStep, pDst, dstStep, roi);
+    };
+    if constexpr (NeedsNearest<Op<T, L>>) {
+        FpGuard nearest(FpRound::kNearest);
+        return run();
+    } else {
+        return run();
+    }
 }
 
 template <template <class, Lay> class Op, class T, Lay L, Order O>

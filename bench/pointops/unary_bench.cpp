@@ -3,9 +3,12 @@
 // saturate -32768), Sqr_16u with a scale factor against cv::multiply of the
 // image with itself. Results are compared within what each side reaches:
 // pvx's e^x and ln x are within 1 ulp; OpenCV's e^x is off by up to 4e-6
-// relative (measured) and it rounds scaled 16u products its own way.
+// relative (measured) and it rounds scaled 16u products its own way. 8u
+// Sqrt and Ln at scale factor 0 against cv::LUT with a table of the same
+// results, what a user would write instead: they must agree exactly.
 #include <opencv2/core.hpp>
 
+#include <cmath>
 #include <cstring>
 #include <memory>
 #include <string>
@@ -97,6 +100,29 @@ PVX_BENCH_CASES(UnaryCases)
             cv::minMaxLoc(d, nullptr, &worst);
             return worst <= 1;
         });
+
+    // 8u tables of round(sqrt x) and round(ln x) (ln 0: 0, the 8u minimum);
+    // no value is a tie at scale factor 0.
+    auto table = [](double (*f)(double)) {
+        cv::Mat t(1, 256, CV_8U);
+        for (int x = 0; x < 256; ++x) t.at<std::uint8_t>(x) = x == 0 ? 0 : static_cast<std::uint8_t>(std::lround(f(x)));
+        return t;
+    };
+    auto exact = [](const Bufs& b) { return cv::norm(b.dst, b.ref, cv::NORM_INF) == 0; };
+    AddCase(
+        "Sqrt_8u_C1RSfs_sf0", CV_8U, 0, 256, 2,
+        [](Bufs& b, PvxiSize roi) {
+            pvxiSqrt_8u_C1RSfs(b.src.ptr<Pvx8u>(), static_cast<int>(b.src.step), b.dst.ptr<Pvx8u>(),
+                               static_cast<int>(b.dst.step), roi, 0);
+        },
+        [t = table([](double x) { return std::sqrt(x); })](Bufs& b) { cv::LUT(b.src, t, b.ref); }, exact);
+    AddCase(
+        "Ln_8u_C1RSfs_sf0", CV_8U, 0, 256, 2,
+        [](Bufs& b, PvxiSize roi) {
+            pvxiLn_8u_C1RSfs(b.src.ptr<Pvx8u>(), static_cast<int>(b.src.step), b.dst.ptr<Pvx8u>(),
+                             static_cast<int>(b.dst.step), roi, 0);
+        },
+        [t = table([](double x) { return std::log(x); })](Bufs& b) { cv::LUT(b.src, t, b.ref); }, exact);
 }
 
 }  // namespace

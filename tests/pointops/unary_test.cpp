@@ -282,6 +282,46 @@ TEST(Unary, ExpLnSpecialValuesAndCallerRounding)
     }
 }
 
+// The integer members round their own way whatever the caller set: every
+// input gives the same result under each rounding mode and under flushing
+// as under round-to-nearest (their tables and steps are built per call).
+template <class T>
+void SameUnderCallerModes(const char* g, PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int))
+{
+    using L = std::numeric_limits<T>;
+    const int count = static_cast<int>(L::max()) - L::min() + 1;
+    std::vector<T> src(count), want(count), got(count);
+    for (int i = 0; i < count; ++i) src[i] = static_cast<T>(L::min() + i);
+    const int w = count >= 256 ? 256 : count, step = w * static_cast<int>(sizeof(T));
+    const PvxiSize roi{w, count / w};
+    for (int sf : {-9, -3, -2, -1, 0, 1, 2, 5}) {
+        PvxStatus st = fn(src.data(), step, want.data(), step, roi, sf);
+        for (int mode : {FE_UPWARD, FE_DOWNWARD, FE_TOWARDZERO, -1}) {
+            const unsigned csr = _mm_getcsr();
+            if (mode < 0) _mm_setcsr(csr | 0x8040u);
+            else std::fesetround(mode);
+            PvxStatus st2 = fn(src.data(), step, got.data(), step, roi, sf);
+            _mm_setcsr(csr);
+            EXPECT_EQ(st2, st) << g << " sf " << sf << " mode " << mode;
+            ASSERT_EQ(std::memcmp(got.data(), want.data(), got.size() * sizeof(T)), 0)
+                << g << " sf " << sf << " mode " << mode;
+        }
+    }
+}
+
+TEST(Unary, IntegerResultsIgnoreCallerRounding)
+{
+    SameUnderCallerModes<Pvx8u>("Sqrt", pvxiSqrt_8u_C1RSfs);
+    SameUnderCallerModes<Pvx16u>("Sqrt", pvxiSqrt_16u_C1RSfs);
+    SameUnderCallerModes<Pvx16s>("Sqrt", pvxiSqrt_16s_C1RSfs);
+    SameUnderCallerModes<Pvx8u>("Exp", pvxiExp_8u_C1RSfs);
+    SameUnderCallerModes<Pvx16u>("Exp", pvxiExp_16u_C1RSfs);
+    SameUnderCallerModes<Pvx16s>("Exp", pvxiExp_16s_C1RSfs);
+    SameUnderCallerModes<Pvx8u>("Ln", pvxiLn_8u_C1RSfs);
+    SameUnderCallerModes<Pvx16u>("Ln", pvxiLn_16u_C1RSfs);
+    SameUnderCallerModes<Pvx16s>("Ln", pvxiLn_16s_C1RSfs);
+}
+
 TEST(Unary, CheckOrders)
 {
     for (const char* g : kGroups)
