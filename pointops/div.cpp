@@ -138,7 +138,7 @@ struct IntDivOp {
             return Quot(a, b);
         } else {
             VI den = alpha.Fill(a);
-            if (MaskBytes(Eq0(den))) *zero = true;
+            if (!*zero && MaskBytes(Eq0(den))) *zero = true;
             return Quot(b, den);
         }
     }

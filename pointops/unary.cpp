@@ -384,11 +384,11 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
             VI r = Zero();
             for (int h = 0; h < 16; ++h)
                 r = Or(r, And(ShuffleBytes(table[h], lo), EqU8(hi, SplatU8(static_cast<std::uint8_t>(h)))));
-            if (MaskBytes(EqU8(a, Zero())) & kCounted8) *this->flag = true;
+            if (!*this->flag && (MaskBytes(EqU8(a, Zero())) & kCounted8)) *this->flag = true;
             return r;
         } else if constexpr (std::is_same_v<T, Pvx32f>) {
             VF x = AsFloat(a);
-            if (MaskF(EqF(x, ZeroF())) & kCounted) *this->flag = true;
+            if (!*this->flag && (MaskF(EqF(x, ZeroF())) & kCounted)) *this->flag = true;
             return AsInt(LnF(x));
         } else {
             // y = ln x 2^-sf in single precision is within 1 ulp, |y| 2^-23, of
@@ -411,7 +411,7 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
                 if (near) [[unlikely]]
                     r[i] = Exact(w[i], r[i], near);
             }
-            if (MaskF(zero) & kCounted) *this->flag = true;
+            if (!*this->flag && (MaskF(zero) & kCounted)) *this->flag = true;
             return Narrow32<T>(r);
         }
     }
@@ -459,7 +459,7 @@ struct LnStepsOp : UnaryBase<LnStepsOp<T, L>, T> {
         VI r = Zero();
         for (int k = 0; k < steps; ++k) r = SubI16(r, GtI16(x, step[k]));
         VI zero = EqI16(a, Zero());
-        if (MaskBytes(zero) & kCounted) *this->flag = true;
+        if (!*this->flag && (MaskBytes(zero) & kCounted)) *this->flag = true;
         if constexpr (std::is_signed_v<T>) r = SelectBytes(r, SplatU16(0x8000), zero);  // ln 0: the minimum
         return r;
     }
@@ -540,7 +540,7 @@ struct Steps8Op : UnaryBase<Steps8Op<K, L, kLn>, Pvx8u> {
 #pragma GCC unroll 32
         for (int k = 0; k < K; ++k) r[k % 4] = SubI8(r[k % 4], GtI8(x, at[k]));
         if constexpr (kLn)
-            if (MaskBytes(EqU8(a, Zero())) & kCounted8) *this->flag = true;
+            if (!*this->flag && (MaskBytes(EqU8(a, Zero())) & kCounted8)) *this->flag = true;
         return AddI8(AddI8(r[0], r[1]), AddI8(r[2], r[3]));
     }
 };
