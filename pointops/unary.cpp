@@ -12,8 +12,8 @@
 //   Sqr: x * x. Integer squares are the image times itself through the exact
 //     integer products of Mul (and its all-zero scale factors).
 //   Sqrt: the exact square root, rounded. In float lanes for 8u and for
-//     16-bit elements at sf >= 0 (roots up to 256), in double lanes for
-//     16-bit elements at sf < 0: the correctly rounded root of x * 4^-sf
+//     16-bit elements at sf >= -2 (roots up to 1024), in double lanes for
+//     16-bit elements below: the correctly rounded root of x * 4^-sf
 //     (sf <= 0) or root times 2^-sf (sf > 0) never crosses a rounding
 //     boundary, as a root of an integer is an integer (exact) or at least
 //     1 / (4 (2y + 1)) away from any half-integer y, far above the rounding
@@ -236,12 +236,14 @@ template <class T, Lay L>
 struct SqrtOp : UnaryBase<SqrtOp<T, L>, T> {
     VF preF, postF;
     VD preD, postD;
-    // 16-bit elements at sf >= 0 in float lanes: the root is at most 256, so
-    // its float error (2^-17) is far below its distance from a rounding
-    // boundary (2^-11, see the top of the file), and the scaling by 2^-sf is
-    // exact. Results agree with the double lanes on every input and scale
-    // factor, in 0.29 of the time on 1080p frames. At sf < 0 results reach
-    // 65535 and boundaries come closer than a float can resolve.
+    // 16-bit elements at sf >= -2 in float lanes: the root is below 1024, so
+    // its float error (below 2^-14 in any rounding mode) is below half its
+    // distance from a rounding boundary (at least 2^-13, see the top of the
+    // file), and the scalings by powers of 2 are exact. Results agree with
+    // the double lanes on every input and scale factor, in 0.29 of the time
+    // on 1080p frames. At sf -3 the margin is gone: under upward rounding
+    // some results differ; below, results reach 65535 and boundaries come
+    // closer than a float can resolve.
     bool floatLanes = false;
     explicit SqrtOp(int sf)
     {
@@ -253,7 +255,7 @@ struct SqrtOp : UnaryBase<SqrtOp<T, L>, T> {
         postF = SplatF(Pow2F(post));
         preD = SplatD(Pow2D(pre));
         postD = SplatD(Pow2D(post));
-        floatLanes = b >= 0;
+        floatLanes = b >= -2;
     }
     VI Vec(VI a) const
     {
