@@ -502,14 +502,14 @@ struct Steps8 {
 inline bool SqrtSteps8(int sf, Steps8& s)
 {
     if (sf < 0) return false;  // results up to 255: the float path
-    for (std::int64_t k = 1; sf <= 4; ++k) {
+    if (sf > 4) return true;   // every result is 0
+    for (std::int64_t k = 1;; ++k) {
         std::int64_t b = (2 * k - 1) * (2 * k - 1) << (2 * sf);
         std::int64_t x = (b + 3) / 4;
         if (b % 4 == 0 && k % 2 == 1) ++x;
-        if (x > 255) break;
+        if (x > 255) return true;
         if (!s.Add(static_cast<int>(x))) return false;
     }
-    return true;  // sf above 4: every result is 0
 }
 
 // Step k is the first x that LnRound takes to k or above. The guess, the
