@@ -146,24 +146,40 @@ TEST(Unary, EveryMemberEveryScaleFactor)
     EXPECT_EQ(n, 16 + 4 * 32 + 1);
 }
 
+// Every value of an integer type once, in rows of 256 (one row for 8u).
+template <class T>
+struct AllInputs {
+    using L = std::numeric_limits<T>;
+    static constexpr int kCount = static_cast<int>(L::max()) - L::min() + 1;
+    static constexpr int kWidth = kCount >= 256 ? 256 : kCount;
+    static constexpr int kStep = kWidth * static_cast<int>(sizeof(T));
+    static constexpr PvxiSize kRoi{kWidth, kCount / kWidth};
+    std::vector<T> src;
+    AllInputs() : src(kCount)
+    {
+        for (int i = 0; i < kCount; ++i) src[i] = static_cast<T>(L::min() + i);
+    }
+    PvxStatus Run(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int), std::vector<T>& dst, int sf) const
+    {
+        dst.assign(kCount, T{});
+        return fn(src.data(), kStep, dst.data(), kStep, kRoi, sf);
+    }
+};
+
 // Every input of the integer types at every scale factor from -10 to 20.
 template <class T>
 void Exhaustive(const char* g, PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int),
                 std::initializer_list<int> extra = {})
 {
-    using L = std::numeric_limits<T>;
-    const int count = static_cast<int>(L::max()) - L::min() + 1;
-    std::vector<T> src(count), dst(count);
-    for (int i = 0; i < count; ++i) src[i] = static_cast<T>(L::min() + i);
-    int w = count >= 256 ? 256 : count;
-    int h = count / w;
+    const AllInputs<T> in;
+    std::vector<T> dst;
     std::vector<int> sfs(extra);
     for (int sf = -10; sf <= 20; ++sf) sfs.push_back(sf);
     for (int sf : sfs) {
-        PvxStatus st = fn(src.data(), w * sizeof(T), dst.data(), w * sizeof(T), {w, h}, sf);
+        PvxStatus st = in.Run(fn, dst, sf);
         ASSERT_EQ(st, std::string(g) == "Ln" ? pvxStsDivByZero : pvxStsNoErr);
-        for (int i = 0; i < count; ++i)
-            ASSERT_EQ(dst[i], RefUnary<T>(g, src[i], sf)) << g << " x " << +src[i] << " sf " << sf;
+        for (int i = 0; i < in.kCount; ++i)
+            ASSERT_EQ(dst[i], RefUnary<T>(g, in.src[i], sf)) << g << " x " << +in.src[i] << " sf " << sf;
     }
 }
 
@@ -288,23 +304,18 @@ TEST(Unary, ExpLnSpecialValuesAndCallerRounding)
 template <class T>
 void SameUnderCallerModes(const char* g, PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int))
 {
-    using L = std::numeric_limits<T>;
-    const int count = static_cast<int>(L::max()) - L::min() + 1;
-    std::vector<T> src(count), want(count), got(count);
-    for (int i = 0; i < count; ++i) src[i] = static_cast<T>(L::min() + i);
-    const int w = count >= 256 ? 256 : count, step = w * static_cast<int>(sizeof(T));
-    const PvxiSize roi{w, count / w};
+    const AllInputs<T> in;
+    std::vector<T> want, got;
     for (int sf : {-9, -3, -2, -1, 0, 1, 2, 5}) {
-        PvxStatus st = fn(src.data(), step, want.data(), step, roi, sf);
+        PvxStatus st = in.Run(fn, want, sf);
         for (int mode : {FE_UPWARD, FE_DOWNWARD, FE_TOWARDZERO, -1}) {
             const unsigned csr = _mm_getcsr();
             if (mode < 0) _mm_setcsr(csr | 0x8040u);
             else std::fesetround(mode);
-            PvxStatus st2 = fn(src.data(), step, got.data(), step, roi, sf);
+            PvxStatus st2 = in.Run(fn, got, sf);
             _mm_setcsr(csr);
             EXPECT_EQ(st2, st) << g << " sf " << sf << " mode " << mode;
-            ASSERT_EQ(std::memcmp(got.data(), want.data(), got.size() * sizeof(T)), 0)
-                << g << " sf " << sf << " mode " << mode;
+            ASSERT_EQ(got, want) << g << " sf " << sf << " mode " << mode;
         }
     }
 }
