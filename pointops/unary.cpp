@@ -11,7 +11,8 @@
 //   Abs (16s, 32f): |x|; Abs of -32768 saturates to 32767.
 //   Sqr: x * x. Integer squares are the image times itself through the exact
 //     integer products of Mul (and its all-zero scale factors).
-//   Sqrt: the exact square root, rounded. In float lanes for 8u and for
+//   Sqrt: the exact square root, rounded. 8u at sf >= 0: the number of
+//     fixed steps that x has reached. In float lanes for other 8u and for
 //     16-bit elements at sf >= -2 (roots up to 1024), in double lanes for
 //     16-bit elements below: the correctly rounded root of x * 4^-sf
 //     (sf <= 0) or root times 2^-sf (sf > 0) never crosses a rounding
@@ -24,12 +25,12 @@
 //     double precision (extended beyond |x| = 700) and rounded half to even;
 //     inputs beyond the table's ends repeat its end values. 32f: ExpF below,
 //     within 1 ulp.
-//   Ln: 16-bit at sf >= 0: the number of fixed steps that x has reached
-//     (results are 0 to 11 there). Other 16-bit: ln x 2^-sf in single
-//     precision (LnF below), rounded half to even; a value too close to a
-//     rounding boundary for that precision is done again in double
-//     precision. 8u: a per-call table of the 256 results in double
-//     precision. 32f: LnF, within 1 ulp.
+//   Ln: 16-bit at sf >= 0 and 8u at sf >= -2: the number of fixed steps
+//     that x has reached (results are 0 to 22 there). Other 16-bit: ln x
+//     2^-sf in single precision (LnF below), rounded half to even; a value
+//     too close to a rounding boundary for that precision is done again in
+//     double precision. Other 8u: a per-call table of the 256 results in
+//     double precision. 32f: LnF, within 1 ulp.
 //     ln 0 counts as a division by zero (a pole), hence the status.
 //   Complement (32s, in place): converts between two's complement and
 //     sign-magnitude. A negative x becomes INT_MIN - x (wrapping): its
@@ -436,55 +437,18 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
     }
 };
 
-// 16-bit elements at sf >= 0: ln x 2^-sf rounded is the number of steps
-// that x has reached, result k from x = kSteps[sf][k - 1] on (at sf 5 and
-// above every positive x gives 0). The steps are the first input of each
-// result of LnRound, and the exhaustive test holds them to a long-double
-// reference on every input. Eleven compares at most in place of two
-// logarithms: 1080p frames take 0.1 to 0.15 of the time.
-template <class T, Lay L>
-struct LnStepsOp : UnaryBase<LnStepsOp<T, L>, T> {
-    static_assert(sizeof(T) == 2);
-    static constexpr int kCounted = L == Lay::AC4 ? 0x3F3F : 0xFFFF;  // bytes of 8 lanes, AC4 alpha not
-    static constexpr std::uint16_t kSteps[5][11] = {{2, 5, 13, 34, 91, 245, 666, 1809, 4915, 13360, 36316},
-                                                    {3, 21, 149, 1097, 8104, 59875},
-                                                    {8, 404, 22027},
-                                                    {55},
-                                                    {2981}};  // 0: no more steps
-    VI step[11];  // x > step[k] (signed compares; 16u biased by 0x8000)
-    int steps = 0;
-    explicit LnStepsOp(int sf)
-    {
-        for (int k = 0; sf < 5 && k < 11 && kSteps[sf][k] != 0; ++k) {
-            int t = kSteps[sf][k];
-            if (t > std::numeric_limits<T>::max()) break;  // 16s: beyond its inputs
-            int bias = std::is_signed_v<T> ? 0 : 0x8000;
-            step[steps++] = SplatU16(static_cast<std::uint16_t>((t - 1) ^ bias));
-        }
-    }
-    VI Vec(VI a) const
-    {
-        VI x = std::is_signed_v<T> ? a : Xor(a, SplatU16(0x8000));
-        VI r = Zero();
-        for (int k = 0; k < steps; ++k) r = SubI16(r, GtI16(x, step[k]));
-        VI zero = EqI16(a, Zero());
-        if (!*this->flag && (MaskBytes(zero) & kCounted)) *this->flag = true;
-        if constexpr (std::is_signed_v<T>) r = SelectBytes(r, SplatU16(0x8000), zero);  // ln 0: the minimum
-        return r;
-    }
-};
+// ---- results of few values ----------------------------------------------------------
 
-// ---- 8u results of few values -------------------------------------------------------
-
-// Sqrt and Ln of 8u take few values at most scale factors (0 to 16 for Sqrt
-// at sf 0, 0 to 6 for Ln at sf 0), and both never decrease with x. Their
-// result is then the number of steps x has reached: two operations a step,
-// where the square roots took four float roots a register and the logarithm
-// table four operations for each of its sixteen registers. On 1080p frames
-// Sqrt at sf 0 takes 0.4 of the time, Ln at sf 0 0.25 and at sf -2 0.7. The
-// steps come from the same rules as the other paths, which the exhaustive
-// test holds them to.
-struct Steps8 {
+// Sqrt of 8u at sf >= 0 and Ln of 8u at sf >= -2 and of 16-bit elements at
+// sf >= 0 take at most 24 values (0 to 16 for Sqrt_8u at sf 0, 0 to 11 for
+// 16-bit Ln at sf 0), and neither ever decreases with x. The result is then
+// the number of fixed steps that x has reached: two operations a step, where
+// the square roots took four float roots a register, the 8u logarithm a table
+// of four operations for each of its sixteen registers, and the 16-bit one
+// two logarithms a register. On 1080p frames Sqrt_8u at sf 0 takes 0.4 of
+// the time, Ln_8u at sf 0 0.25 and at sf -2 0.7, 16-bit Ln at sf 0 0.1. The
+// exhaustive test holds the steps to the rules of the other paths.
+struct Steps {
     static constexpr int kMax = 24;
     int at[kMax];  // x >= at[k] adds one; a step repeats where the result jumps by more
     int n = 0;
@@ -499,7 +463,7 @@ struct Steps8 {
 // round(sqrt(x) 2^-sf) >= k where sqrt(x) >= (k - 1/2) 2^sf, that is 4x >= b
 // with b = (2k - 1)^2 4^sf. At 4x == b (sf >= 1) the value is a tie, which
 // goes to the even one of k - 1 and k.
-inline bool SqrtSteps8(int sf, Steps8& s)
+inline bool SqrtSteps8(int sf, Steps& s)
 {
     if (sf < 0) return false;  // results up to 255: the float path
     if (sf > 4) return true;   // every result is 0
@@ -512,45 +476,62 @@ inline bool SqrtSteps8(int sf, Steps8& s)
     }
 }
 
-// Step k is the first x that LnRound takes to k or above. The guess, the
-// ceiling of e^((k - 1/2) 2^sf), is that x unless e^(...) lies within the
-// rounding of log and exp of an integer; the walks make it exact either way.
-inline bool LnSteps8(int sf, Steps8& s)
+// The first inputs at which LnRound reaches 1, 2, ..., at sf -2 to 4 (rows
+// -2 and -1 up to 255, for 8u only), as a loop over every input printed them.
+// Below sf -2 the 8u results outgrow Steps, 16-bit results do below 0, and
+// from sf 5 on every positive input gives 0.
+inline constexpr std::uint16_t kLnSteps[7][22] = {
+    {2, 2, 2, 3, 4, 4, 6, 7, 9, 11, 14, 18, 23, 30, 38, 49, 62, 80, 103, 131, 169, 216},
+    {2, 3, 4, 6, 10, 16, 26, 43, 71, 116, 191},
+    {2, 5, 13, 34, 91, 245, 666, 1809, 4915, 13360, 36316},
+    {3, 21, 149, 1097, 8104, 59875},
+    {8, 404, 22027},
+    {55},
+    {2981}};  // 0: no more steps
+
+template <class T>
+bool LnSteps(int sf, Steps& s)
 {
-    int top = LnRound<Pvx8u>(255, sf);
-    if (top > Steps8::kMax) return false;
-    for (int k = 1; k <= top; ++k) {
-        double g = std::ceil(std::exp(std::ldexp(k - 0.5, Bound(sf, -40, 40))));
-        int x = g < 1 ? 1 : g > 255 ? 255 : static_cast<int>(g);
-        while (x > 1 && LnRound<Pvx8u>(x - 1, sf) >= k) --x;
-        while (LnRound<Pvx8u>(x, sf) < k) ++x;  // ends by 255, whose result is top
-        s.Add(x);
+    if (sf < (sizeof(T) == 1 ? -2 : 0)) return false;
+    if (sf > 4) return true;
+    for (int t : kLnSteps[sf + 2]) {
+        if (t == 0 || t > std::numeric_limits<T>::max()) break;
+        s.Add(t);
     }
     return true;
 }
 
-template <int K, Lay L, bool kLn>
+template <class T, int K, Lay L, bool kLn>
     requires(K % 4 == 0)
-struct Steps8Op : UnaryBase<Steps8Op<K, L, kLn>, Pvx8u> {
-    static constexpr int kCounted8 = L == Lay::AC4 ? 0x7777 : 0xFFFF;  // ln 0 in these bytes counts
-    // Step t as (t - 1) ^ 0x80: x has reached it where x ^ 0x80 is above it in
-    // a signed compare. Unused steps are 0x7F, above every x.
+struct StepsOp : UnaryBase<StepsOp<T, K, L, kLn>, T> {
+    static constexpr bool k8 = sizeof(T) == 1;
+    static constexpr int kCounted = L != Lay::AC4 ? 0xFFFF : k8 ? 0x7777 : 0x3F3F;  // bytes where ln 0 counts
+    // Step t as t - 1 in a signed compare: x, its sign bit flipped for the
+    // unsigned types, has reached it where it is above it. Unused steps are
+    // the largest signed value, above every x.
+    static constexpr int kFlip = std::is_signed_v<T> ? 0 : k8 ? 0x80 : 0x8000;
+    static constexpr int kTop = k8 ? 0x7F : 0x7FFF;
     VI at[K];
-    explicit Steps8Op(const Steps8& s)
+    static VI Splat(int v) { return k8 ? SplatU8(static_cast<std::uint8_t>(v)) : SplatU16(static_cast<std::uint16_t>(v)); }
+    explicit StepsOp(const Steps& s)
     {
-        for (int k = 0; k < K; ++k)
-            at[k] = SplatU8(static_cast<std::uint8_t>(k < s.n ? (s.at[k] - 1) ^ 0x80 : 0x7F));
+        for (int k = 0; k < K; ++k) at[k] = Splat(k < s.n ? (s.at[k] - 1) ^ kFlip : kTop);
     }
     VI Vec(VI a) const
     {
         // Four sums, unrolled: one sum took a cycle a step, and a rolled loop
-        // three, twice the time of the table at 24 steps.
-        VI x = Xor(a, SplatU8(0x80)), r[4] = {Zero(), Zero(), Zero(), Zero()};
+        // three, twice the time of the 8u table at 24 steps.
+        VI x = kFlip ? Xor(a, Splat(kFlip)) : a, r[4] = {Zero(), Zero(), Zero(), Zero()};
 #pragma GCC unroll 32
-        for (int k = 0; k < K; ++k) r[k % 4] = SubI8(r[k % 4], GtI8(x, at[k]));
-        if constexpr (kLn)
-            if (!*this->flag && (MaskBytes(EqU8(a, Zero())) & kCounted8)) *this->flag = true;
-        return AddI8(AddI8(r[0], r[1]), AddI8(r[2], r[3]));
+        for (int k = 0; k < K; ++k)
+            r[k % 4] = k8 ? SubI8(r[k % 4], GtI8(x, at[k])) : SubI16(r[k % 4], GtI16(x, at[k]));
+        VI sum = k8 ? AddI8(AddI8(r[0], r[1]), AddI8(r[2], r[3])) : AddI16(AddI16(r[0], r[1]), AddI16(r[2], r[3]));
+        if constexpr (kLn) {
+            VI zero = k8 ? EqU8(a, Zero()) : EqI16(a, Zero());
+            if (!*this->flag && (MaskBytes(zero) & kCounted)) *this->flag = true;
+            if constexpr (std::is_signed_v<T>) sum = SelectBytes(sum, SplatU16(0x8000), zero);  // ln 0: the minimum
+        }
+        return sum;
     }
 };
 
@@ -588,13 +569,16 @@ PvxStatus RunUnary(Op op, const T* pSrc, int srcStep, T* pDst, int dstStep, Pvxi
     return met ? pvxStsDivByZero : pvxStsNoErr;
 }
 
-// Steps8Op with room for the steps of s.
+// StepsOp with room for the steps of s: 8, 16 or 24 for 8u, 4, 8 or 12 for
+// 16-bit elements (11 at most).
 template <class T, Lay L, bool kLn>
-PvxStatus RunSteps8(const Steps8& s, const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
+PvxStatus RunSteps(const Steps& s, const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
 {
-    if (s.n <= 8) return RunUnary<T, L>(Steps8Op<8, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
-    if (s.n <= 16) return RunUnary<T, L>(Steps8Op<16, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
-    return RunUnary<T, L>(Steps8Op<Steps8::kMax, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
+    constexpr int kUnit = sizeof(T) == 1 ? 8 : 4;
+    if (s.n <= kUnit) return RunUnary<T, L>(StepsOp<T, kUnit, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
+    if (s.n <= 2 * kUnit)
+        return RunUnary<T, L>(StepsOp<T, 2 * kUnit, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
+    return RunUnary<T, L>(StepsOp<T, 3 * kUnit, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
 }
 
 // Exp and Ln build their tables and steps, and run, under round-to-nearest
@@ -613,13 +597,10 @@ PvxStatus RunUnaryOp(int scaleFactor, const T* pSrc, int srcStep, T* pDst, int d
     constexpr bool kLn = std::is_same_v<Op<T, L>, LnOp<T, L>>;
     constexpr bool kSqrt = std::is_same_v<Op<T, L>, SqrtOp<T, L>>;
     auto run = [&]() -> PvxStatus {
-        if constexpr (kLn && sizeof(T) == 2)
-            if (scaleFactor >= 0)
-                return RunUnary<T, L>(LnStepsOp<T, L>(scaleFactor), pSrc, srcStep, pDst, dstStep, roi);
-        if constexpr ((kLn || kSqrt) && std::is_same_v<T, Pvx8u>) {
-            Steps8 s;
-            if (kLn ? LnSteps8(scaleFactor, s) : SqrtSteps8(scaleFactor, s))
-                return RunSteps8<T, L, kLn>(s, pSrc, srcStep, pDst, dstStep, roi);
+        if constexpr ((kLn && sizeof(T) <= 2) || (kSqrt && std::is_same_v<T, Pvx8u>)) {
+            Steps s;
+            if (kLn ? LnSteps<T>(scaleFactor, s) : SqrtSteps8(scaleFactor, s))
+                return RunSteps<T, L, kLn>(s, pSrc, srcStep, pDst, dstStep, roi);
         }
         return RunUnary<T, L>(Op<T, L>(scaleFactor), pSrc, srcStep, pDst, dstStep, roi);
     };
