@@ -254,6 +254,8 @@ inline VD RoundEvenD(VD a) { return _mm_round_pd(a, _MM_FROUND_TO_NEAREST_INT | 
 // 0-1 (rounded by the rounding control: give it integral values).
 inline VD CvtLoI32D(VI a) { return _mm_cvtepi32_pd(a); }
 inline VD CvtHiI32D(VI a) { return _mm_cvtepi32_pd(_mm_unpackhi_epi64(a, a)); }
+inline VD CvtLoFD(VF a) { return _mm_cvtps_pd(a); }
+inline VD CvtHiFD(VF a) { return _mm_cvtps_pd(_mm_movehl_ps(a, a)); }
 inline VI CvtD32Pair(VD lo, VD hi) { return _mm_unpacklo_epi64(_mm_cvtpd_epi32(lo), _mm_cvtpd_epi32(hi)); }
 
 // ---- rows of any length ----
