@@ -25,7 +25,7 @@
 //     double precision (extended beyond |x| = 700) and rounded half to even;
 //     inputs beyond the table's ends repeat its end values. 32f: ExpF below,
 //     within 1 ulp.
-//   Ln: 16-bit at sf >= 0 and 8u at sf >= -2: the number of fixed steps
+//   Ln: 16-bit at sf >= -1 and 8u at sf >= -2: the number of fixed steps
 //     that x has reached (results are 0 to 22 there). Other 16-bit: ln x
 //     2^-sf in single precision (LnF below), rounded half to even; a value
 //     too close to a rounding boundary for that precision is done again in
@@ -462,14 +462,15 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
 // ---- results of few values ----------------------------------------------------------
 
 // Sqrt of 8u at sf >= 0 and Ln of 8u at sf >= -2 and of 16-bit elements at
-// sf >= 0 take at most 24 values (0 to 16 for Sqrt_8u at sf 0, 0 to 11 for
-// 16-bit Ln at sf 0), and neither ever decreases with x. The result is then
+// sf >= -1 take at most 24 values (0 to 16 for Sqrt_8u at sf 0, 0 to 22 for
+// 16-bit Ln at sf -1), and neither ever decreases with x. The result is then
 // the number of fixed steps that x has reached: two operations a step, where
 // the square roots took four float roots a register, the 8u logarithm a table
 // of four operations for each of its sixteen registers, and the 16-bit one
 // two logarithms a register. On 1080p frames Sqrt_8u at sf 0 takes 0.4 of
-// the time, Ln_8u at sf 0 0.25 and at sf -2 0.7, 16-bit Ln at sf 0 0.1. The
-// exhaustive test holds the steps to the rules of the other paths.
+// the time, Ln_8u at sf 0 0.25 and at sf -2 0.7, 16-bit Ln at sf 0 0.1 and
+// at sf -1 0.35. The exhaustive test holds the steps to the rules of the
+// other paths.
 struct Steps {
     static constexpr int kMax = 24;
     int at[kMax];  // x >= at[k] adds one; a step repeats where the result jumps by more
@@ -498,13 +499,13 @@ inline bool SqrtSteps8(int sf, Steps& s)
     }
 }
 
-// The first inputs at which LnRound reaches 1, 2, ..., at sf -2 to 4 (rows
-// -2 and -1 up to 255, for 8u only), as a loop over every input printed them.
-// Below sf -2 the 8u results outgrow Steps, 16-bit results do below 0, and
+// The first inputs at which LnRound reaches 1, 2, ..., at sf -2 to 4 (row
+// -2 up to 255, for 8u only), as a loop over every input printed them.
+// Below sf -2 the 8u results outgrow Steps, 16-bit results do below -1, and
 // from sf 5 on every positive input gives 0.
 inline constexpr std::uint16_t kLnSteps[7][22] = {
     {2, 2, 2, 3, 4, 4, 6, 7, 9, 11, 14, 18, 23, 30, 38, 49, 62, 80, 103, 131, 169, 216},
-    {2, 3, 4, 6, 10, 16, 26, 43, 71, 116, 191},
+    {2, 3, 4, 6, 10, 16, 26, 43, 71, 116, 191, 315, 519, 855, 1409, 2322, 3828, 6311, 10405, 17155, 28283, 46631},
     {2, 5, 13, 34, 91, 245, 666, 1809, 4915, 13360, 36316},
     {3, 21, 149, 1097, 8104, 59875},
     {8, 404, 22027},
@@ -514,7 +515,7 @@ inline constexpr std::uint16_t kLnSteps[7][22] = {
 template <class T>
 bool LnSteps(int sf, Steps& s)
 {
-    if (sf < (sizeof(T) == 1 ? -2 : 0)) return false;
+    if (sf < (sizeof(T) == 1 ? -2 : -1)) return false;
     if (sf > 4) return true;
     for (int t : kLnSteps[sf + 2]) {
         if (t == 0 || t > std::numeric_limits<T>::max()) break;
@@ -591,16 +592,15 @@ PvxStatus RunUnary(Op op, const T* pSrc, int srcStep, T* pDst, int dstStep, Pvxi
     return met ? pvxStsDivByZero : pvxStsNoErr;
 }
 
-// StepsOp with room for the steps of s: 8, 16 or 24 for 8u, 4, 8 or 12 for
-// 16-bit elements (11 at most).
+// StepsOp with room for the steps of s: 8, 16 or 24 for 8u; 4 (16-bit Ln
+// at sf 2 to 4), 12 (sf 0 and 1) or 24 (sf -1) for 16-bit elements.
 template <class T, Lay L, bool kLn>
 PvxStatus RunSteps(const Steps& s, const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
 {
-    constexpr int kUnit = sizeof(T) == 1 ? 8 : 4;
-    if (s.n <= kUnit) return RunUnary<T, L>(StepsOp<T, kUnit, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
-    if (s.n <= 2 * kUnit)
-        return RunUnary<T, L>(StepsOp<T, 2 * kUnit, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
-    return RunUnary<T, L>(StepsOp<T, 3 * kUnit, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
+    constexpr int kFew = sizeof(T) == 1 ? 8 : 4, kMore = sizeof(T) == 1 ? 16 : 12;
+    if (s.n <= kFew) return RunUnary<T, L>(StepsOp<T, kFew, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
+    if (s.n <= kMore) return RunUnary<T, L>(StepsOp<T, kMore, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
+    return RunUnary<T, L>(StepsOp<T, Steps::kMax, L, kLn>(s), pSrc, srcStep, pDst, dstStep, roi);
 }
 
 // Exp and Ln build their tables and steps, and run, under round-to-nearest
@@ -610,7 +610,7 @@ template <class Op>
 concept NeedsNearest = requires { Op::kNearest; };
 
 // The op of a call: Op, or one that counts steps where the results take few
-// values (Ln of 16-bit elements at sf >= 0, Sqrt of 8u at sf >= 0, Ln of 8u
+// values (Ln of 16-bit elements at sf >= -1, Sqrt of 8u at sf >= 0, Ln of 8u
 // at sf >= -2). Ops of their own, chosen per call: a test of the scale
 // factor in LnOp's register loop made the other scale factors 17% slower.
 template <template <class, Lay> class Op, class T, Lay L>
