@@ -420,8 +420,8 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
             // the exact value; a lane within y 2^-22 of a rounding boundary (a
             // half-integer) is done again in double precision (LnD), in the
             // register loop: a call there, however rare, made the compiler
-            // keep the constants in memory (1080p 16u at sf -1 1.35 times
-            // slower). No result that is not saturated lies nearer a boundary
+            // keep more of the constants in memory (1080p frames 1.1 times
+            // slower, 16u at sf -8 and 16s at sf -4). No result that is not saturated lies nearer a boundary
             // than 2^-35.9 of it (x 16056 at sf -11; a long-double loop over
             // every input and sf -40 to -1 found it). The inputs are
             // integers, so the logarithm of max(x, 1) needs none of LnF's
