@@ -177,6 +177,7 @@ inline VI SraI32(VI v, VI n) { return _mm_sra_epi32(v, n); }
 inline VI EqI16(VI a, VI b) { return _mm_cmpeq_epi16(a, b); }
 inline VI GtI8(VI a, VI b) { return _mm_cmpgt_epi8(a, b); }  // signed
 inline VI GtI16(VI a, VI b) { return _mm_cmpgt_epi16(a, b); }  // signed
+inline VI GtI32(VI a, VI b) { return _mm_cmpgt_epi32(a, b); }  // signed
 inline VI AbsI16(VI a) { return _mm_abs_epi16(a); }
 inline VI MaxU16(VI a, VI b) { return _mm_max_epu16(a, b); }
 inline VI MinU8(VI a, VI b) { return _mm_min_epu8(a, b); }
