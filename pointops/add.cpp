@@ -14,7 +14,9 @@ using namespace simd;
 // clear its lowest bit: an odd average steps back to its even neighbour and
 // an even one is left as it is. 4 operations a register instead of 16.
 struct AddX : ExactBase {
+    static constexpr bool kSum = true;
     static constexpr bool kFits16 = true;
+    static VD D(VD a, VD b) { return AddD(a, b); }
     static Wide Exact(Wide a, Wide b) { return a + b; }
     static float F(float a, float b) { return a + b; }
     static VF V(VF a, VF b) { return AddF(a, b); }

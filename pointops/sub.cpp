@@ -14,7 +14,9 @@ using namespace simd;
 // rounding stay within 16-bit lanes; at scale factor 0 the saturating
 // subtraction is the whole rule.
 struct SubX : ExactBase {
+    static constexpr bool kSum = true;
     static constexpr bool kFits16 = true;
+    static VD D(VD a, VD b) { return SubD(b, a); }
     static Wide Exact(Wide a, Wide b) { return b - a; }
     static float F(float a, float b) { return b - a; }
     static VF V(VF a, VF b) { return SubF(b, a); }
@@ -31,7 +33,9 @@ struct SubX : ExactBase {
 
 // a - value.
 struct SubCX : ExactBase {
+    static constexpr bool kSum = true;
     static constexpr bool kFits16 = true;
+    static VD D(VD a, VD b) { return SubD(a, b); }
     static Wide Exact(Wide a, Wide b) { return a - b; }
     static float F(float a, float b) { return a - b; }
     static VF V(VF a, VF b) { return SubF(a, b); }
