@@ -341,7 +341,7 @@ struct IntOp {
             for (int i = 0; i < kN; ++i) r[i] = Scale32<M, X::template kU32<U>>(r[i], k);
             return Narrow32<U>(r);
         } else {
-            static_assert(sizeof(U) <= 2, "no vector path for 32-bit elements");
+            static_assert(sizeof(U) <= 2, "32-bit sums take the double lanes of Vec");
             return a;
         }
     }

@@ -401,12 +401,11 @@ struct LnOp : UnaryBase<LnOp<T, L>, T> {
     // likewise for the 16 bytes of 8u.
     static constexpr int kCounted = L == Lay::AC4 ? 0x7 : 0xF;
     static constexpr int kCounted8 = L == Lay::AC4 ? 0x7777 : 0xFFFF;
-    int sf;
     VF scale;
     VD scaleD;
     VI table[std::is_same_v<T, Pvx8u> ? 16 : 1];  // 8u: the 256 results, 16 a register
-    explicit LnOp(int scaleFactor) : sf(scaleFactor), scale(SplatF(Pow2F(-Bound(scaleFactor, -40, 40)))),
-                                     scaleD(SplatD(Pow2D(-Bound(scaleFactor, -40, 40))))
+    explicit LnOp(int sf)
+        : scale(SplatF(Pow2F(-Bound(sf, -40, 40)))), scaleD(SplatD(Pow2D(-Bound(sf, -40, 40))))
     {
         if constexpr (std::is_same_v<T, Pvx8u>) {
             alignas(16) Pvx8u t[256];
