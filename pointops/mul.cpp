@@ -13,18 +13,58 @@ using mul::MulX;
 
 // Complex product of integer parts: re = ac - bd, im = ad + bc, exact in wide
 // integers, each part under the scale-factor rule.
+//
+// 16sc has a vector path in 32-bit lanes, four numbers a register. Both
+// parts are exact there: ac and bd come from multiply-adds with one half of
+// each pair masked off, and ac - bd lies within (-2^31, 2^31); ad + bc comes
+// from one multiply-add with c and d swapped and reaches 2^31, which wraps to
+// -2^31, only when all four parts are -32768 (no other sum comes near -2^31),
+// so that lane is set to 2^31 - 1, which every scale factor rounds and
+// saturates as it does 2^31. As the parts use all 32 bits, the rounding
+// compares the remainder with the halfway point instead of adding before the
+// shift (that addition would overflow).
 template <class T, Sf M>
 struct CMulIntOp {
     using Unit = T;
     using E = Element<T>;
-    static constexpr bool kHasVector = false;
-    int sf;
-    explicit CMulIntOp(int s) : sf(s) {}
-    bool Vector() const { return false; }
+    static constexpr bool kHasVector = std::is_same_v<T, Pvx16sc>;
+    SfsK k;
+    VI lowBits, halfway;  // sf 1 to 31: 2^sf - 1, 2^(sf-1)
+    // (sf 32 and above never get here: every result is 0, filled before)
+    explicit CMulIntOp(int s) : k(MakeSfsK<E>(s, M)), lowBits(Zero()), halfway(Zero())
+    {
+        if (M == Sf::kDown && s < 32) {
+            lowBits = SplatU32(static_cast<std::uint32_t>((std::uint64_t{1} << s) - 1));
+            halfway = SplatU32(std::uint32_t{1} << (s - 1));
+        }
+    }
+    bool Vector() const { return kHasVector; }
     T Scalar(T x, T y) const
     {
         Wide a = x.re, b = x.im, c = y.re, d = y.im;
-        return {SfsScalar<E>(a * c - b * d, sf), SfsScalar<E>(a * d + b * c, sf)};
+        return {SfsScalar<E>(a * c - b * d, k.sf), SfsScalar<E>(a * d + b * c, k.sf)};
+    }
+    VI Vec(VI x, VI y) const
+    {
+        const VI re = SplatU32(0xFFFF);
+        const VI swap = _mm_setr_epi8(2, 3, 0, 1, 6, 7, 4, 5, 10, 11, 8, 9, 14, 15, 12, 13);
+        const VI pairs = _mm_setr_epi8(0, 1, 8, 9, 2, 3, 10, 11, 4, 5, 12, 13, 6, 7, 14, 15);
+        VI r = SubI32(MulAddPairsI16(And(x, re), y), MulAddPairsI16(AndNot(re, x), y));
+        VI i = MulAddPairsI16(x, ShuffleBytes(y, swap));
+        i = Xor(i, EqI32(i, SplatU32(0x80000000u)));
+        return ShuffleBytes(PackSsS32(Scale(r), Scale(i)), pairs);
+    }
+    // Any 32-bit exact part: down by the floor and a rounding step, up by
+    // the clamped shift; the pack saturates.
+    VI Scale(VI v) const
+    {
+        if constexpr (M == Sf::kDown) {
+            VI q = SraI32(v, k.cnt);
+            VI inc = GtI32(And(v, lowBits), SubI32(halfway, And(q, k.one32)));
+            return SubI32(q, inc);
+        } else {
+            return Scale32<M>(v, k);
+        }
     }
 };
 

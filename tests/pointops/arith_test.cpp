@@ -392,6 +392,33 @@ TEST(Mul, ComplexProduct)
     EXPECT_EQ(fd.im, -7.625f);
 }
 
+// Every pairing of parts from the extremes and their neighbours, in rows long
+// enough for whole registers: the sums that reach 2^31 (all four parts
+// -32768) or come near it, and ties, at every scale factor where they differ.
+TEST(Mul, ComplexExtremes16sc)
+{
+    const Pvx16s parts[] = {-32768, -32767, -16384, -3, -1, 0, 1, 2, 16384, 32767};
+    std::vector<Pvx16sc> a, b;
+    for (Pvx16s p : parts)
+        for (Pvx16s q : parts)
+            for (Pvx16s r : parts)
+                for (Pvx16s s : parts) {
+                    a.push_back({p, q});
+                    b.push_back({r, s});
+                }
+    const int n = static_cast<int>(a.size());
+    std::vector<Pvx16sc> d(n);
+    for (int sf = -17; sf <= 33; ++sf) {
+        SCOPED_TRACE(sf);
+        ASSERT_EQ(pvxiMul_16sc_C1RSfs(a.data(), 4 * n, b.data(), 4 * n, d.data(), 4 * n, {n, 1}, sf), pvxStsNoErr);
+        for (int i = 0; i < n; ++i) {
+            Pvx16sc want = pvxref::RefBin(Bin::kMul, a[i], b[i], sf);
+            ASSERT_TRUE(d[i].re == want.re && d[i].im == want.im)
+                << i << ": (" << a[i].re << ", " << a[i].im << ") (" << b[i].re << ", " << b[i].im << ")";
+        }
+    }
+}
+
 TEST(Mul, ZeroFromScaleFactor17For8u)
 {
     Pvx8u a = 255, d = 9;
