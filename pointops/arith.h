@@ -476,6 +476,12 @@ concept HasVec4 = requires(const Op& o, const simd::VI* v, simd::VI* r) { o.Vec4
 template <class Op>
 concept ScalarTailOp = requires { requires Op::kScalarTail; };
 
+// An op over two images that must know which lanes are kept (a divisor's
+// zero test, which the alpha lanes of AC4 must not set off) takes the mask
+// of kept bytes (all zero outside AC4) as a third argument.
+template <class Op>
+concept KeepAwareOp = requires(const Op& o, simd::VI v) { o.Vec(v, v, v); };
+
 // The op on one register's inputs: two images, an image and a constant, or
 // one image; AC4 keeps the bytes of vd that keep selects.
 template <class Op, Src2 K, bool kAlpha>
@@ -483,7 +489,8 @@ template <class Op, Src2 K, bool kAlpha>
                                                simd::VI keep)
 {
     simd::VI v;
-    if constexpr (K == Src2::kImage) v = o.Vec(va, vb);
+    if constexpr (K == Src2::kImage && KeepAwareOp<Op>) v = o.Vec(va, vb, keep);
+    else if constexpr (K == Src2::kImage) v = o.Vec(va, vb);
     else if constexpr (K == Src2::kConst) v = o.Vec(va, c);
     else v = o.Vec(va);
     if constexpr (kAlpha) v = simd::SelectBytes(v, vd, keep);

@@ -273,8 +273,9 @@ struct DivC32fOp {
 
 // ---- complex ------------------------------------------------------------------------
 
-// Complex quotient, pixel by pixel (no vector path): num / den with the parts
-// of 16sc and 32sc exact under the Sfs rule, 32fc in single precision.
+// Complex quotient: num / den with the parts of 16sc and 32sc exact under
+// the Sfs rule (pixel by pixel), 32fc in single precision, two numbers a
+// register, each part by the same operations in the same order as Scalar.
 template <class T, bool kConst>
 struct CplxDivOp {
     using Unit = T;
@@ -283,9 +284,33 @@ struct CplxDivOp {
     bool* zero = nullptr;  // set when a zero divisor is met (the row loop copies the op)
 
     explicit CplxDivOp(int scaleFactor) : sf(scaleFactor) {}
-    static constexpr bool kHasVector = false;
-    bool Vector() const { return false; }
-    VI Vec(VI a, VI) const { return a; }  // never called
+    static constexpr bool kHasVector = std::is_same_v<T, Pvx32fc>;
+    bool Vector() const { return kHasVector; }
+
+    // A constant divisor has no zero part pair (the call refused it).
+    VI Vec(VI a, VI b) const { return Vec(a, b, Zero()); }
+    // keep: the alpha lanes of AC4, whose divisors are not looked at.
+    VI Vec(VI a, VI b, VI keep) const
+    {
+        VF num = AsFloat(kConst ? a : b), den = AsFloat(kConst ? b : a);
+        VF p = MulF(num, den);               // ac, bd
+        VF t = MulF(num, SwapPairsF(den));   // ad, bc
+        VF dd = MulF(den, den);
+        VF m = AddF(DupEvenF(dd), DupOddF(dd));  // c^2 + d^2
+        // (bc - ad, ac + bd) in one add-subtract, then back to (re, im)
+        VF x = SwapPairsF(_mm_blend_ps(p, t, 0xA));  // bc, ac
+        VF y = _mm_blend_ps(t, p, 0xA);              // ad, bd
+        VF q = DivF(SwapPairsF(SubAddF(x, y)), m);
+        if constexpr (!kConst) {
+            VF z = EqF(den, ZeroF());
+            z = AndNotF(AsFloat(keep), AndF(z, SwapPairsF(z)));
+            if (MaskF(z)) [[unlikely]] {
+                *zero = true;
+                q = SelectF(q, OverZero(num), z);
+            }
+        }
+        return AsInt(q);
+    }
 
     T Scalar(T a, T b) const
     {
