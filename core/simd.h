@@ -248,6 +248,7 @@ inline VD AndD(VD a, VD b) { return _mm_and_pd(a, b); }
 inline VD AndNotD(VD notThis, VD b) { return _mm_andnot_pd(notThis, b); }
 inline VD OrD(VD a, VD b) { return _mm_or_pd(a, b); }
 inline VD GeD(VD a, VD b) { return _mm_cmpge_pd(a, b); }
+inline VD EqD(VD a, VD b) { return _mm_cmpeq_pd(a, b); }
 inline VD OrderedD(VD a) { return _mm_cmpord_pd(a, a); }
 inline VD TruncD(VD a) { return _mm_round_pd(a, _MM_FROUND_TO_ZERO | _MM_FROUND_NO_EXC); }
 inline VD RoundEvenD(VD a) { return _mm_round_pd(a, _MM_FROUND_TO_NEAREST_INT | _MM_FROUND_NO_EXC); }

@@ -274,17 +274,37 @@ struct DivC32fOp {
 // ---- complex ------------------------------------------------------------------------
 
 // Complex quotient: num / den with the parts of 16sc and 32sc exact under
-// the Sfs rule (pixel by pixel), 32fc in single precision, two numbers a
-// register, each part by the same operations in the same order as Scalar.
+// the Sfs rule, 32fc in single precision.
+//
+// 32fc: two numbers a register, each part by the same operations in the same
+// order as Scalar.
+//
+// 16sc: four numbers a register, the quotients in double lanes. The parts'
+// numerators ac + bd and bc - ad and the divisor c^2 + d^2 are exact in
+// 32-bit multiply-adds, except that ac + bd and c^2 + d^2 wrap to -2^31 where
+// they reach 2^31 (parts of -32768), which the conversion to double lifts
+// back. By the argument at the top of this file the correctly rounded double
+// quotient decides every rounding like the exact one at every scale factor:
+// a quotient v = N / m below the saturation point has |N| < 2^15 m <= 2^46,
+// so it lies at least 2^-47 of itself from any boundary it does not equal,
+// and the division errs by at most 2^-53. Beyond 2^46 every non-zero
+// result saturates, so the scale is capped there. A zero divisor puts each
+// part of the dividend over 0, whose infinities and NaN the saturation takes
+// to the maximum, minimum and 0.
 template <class T, bool kConst>
 struct CplxDivOp {
     using Unit = T;
     using E = Element<T>;
+    static constexpr bool kS16 = std::is_same_v<T, Pvx16sc>;
     int sf;
+    VD scaleD;
     bool* zero = nullptr;  // set when a zero divisor is met (the row loop copies the op)
 
-    explicit CplxDivOp(int scaleFactor) : sf(scaleFactor) {}
-    static constexpr bool kHasVector = std::is_same_v<T, Pvx32fc>;
+    explicit CplxDivOp(int scaleFactor)
+        : sf(scaleFactor), scaleD(SplatD(Pow2D(scaleFactor > 40 ? -40 : scaleFactor < -46 ? 46 : -scaleFactor)))
+    {
+    }
+    static constexpr bool kHasVector = std::is_same_v<T, Pvx32fc> || kS16;
     bool Vector() const { return kHasVector; }
 
     // A constant divisor has no zero part pair (the call refused it).
@@ -292,6 +312,7 @@ struct CplxDivOp {
     // keep: the alpha lanes of AC4, whose divisors are not looked at.
     VI Vec(VI a, VI b, VI keep) const
     {
+        if constexpr (kS16) return VecS16(kConst ? a : b, kConst ? b : a, keep);
         VF num = AsFloat(kConst ? a : b), den = AsFloat(kConst ? b : a);
         VF p = MulF(num, den);               // ac, bd
         VF t = MulF(num, SwapPairsF(den));   // ad, bc
@@ -310,6 +331,33 @@ struct CplxDivOp {
             }
         }
         return AsInt(q);
+    }
+
+    VI VecS16(VI x, VI y, VI keep) const
+    {
+        const VI re = SplatU32(0xFFFF);
+        const VI swap = _mm_setr_epi8(2, 3, 0, 1, 6, 7, 4, 5, 10, 11, 8, 9, 14, 15, 12, 13);
+        const VI pairs = _mm_setr_epi8(0, 1, 8, 9, 2, 3, 10, 11, 4, 5, 12, 13, 6, 7, 14, 15);
+        VI ys = ShuffleBytes(y, swap);
+        VI nr = MulAddPairsI16(x, y);                                                     // ac + bd
+        VI ni = SubI32(MulAddPairsI16(AndNot(re, x), ys), MulAddPairsI16(And(x, re), ys));  // bc - ad
+        VI m = MulAddPairsI16(y, y);                                                      // c^2 + d^2
+        if constexpr (!kConst) {
+            VI z = AndNot(keep, EqI32(m, Zero()));
+            if (MaskBytes(z)) [[unlikely]] {
+                *zero = true;
+                nr = SelectBytes(nr, SraI32n(SllI32n(x, 16), 16), z);
+                ni = SelectBytes(ni, SraI32n(x, 16), z);
+            }
+        }
+        const VD wrapped = SplatD(-2147483648.0), lift = SplatD(4294967296.0);
+        auto d = [&](VD v) { return AddD(v, AndD(EqD(v, wrapped), lift)); };
+        VD ml = d(CvtLoI32D(m)), mh = d(CvtHiI32D(m));
+        auto quot = [&](VI n) {
+            return SatI32<E, Rnd::kEven>(DivD(MulD(d(CvtLoI32D(n)), scaleD), ml),
+                                         DivD(MulD(d(CvtHiI32D(n)), scaleD), mh));
+        };
+        return ShuffleBytes(PackSsS32(quot(nr), quot(ni)), pairs);
     }
 
     T Scalar(T a, T b) const
@@ -382,9 +430,18 @@ PvxStatus DivRun(const T* a, int aStep, const T* b, int bStep, T* d, int dStep, 
             }
         }
     } else if constexpr (kIsComplex<T>) {
-        CplxDivOp<T, kC> op(sf);
-        op.zero = &zero;
-        RunRows<T, L, K>(op, a, aStep, b, bStep, d, dStep, roi, value);
+        auto run = [&] {
+            CplxDivOp<T, kC> op(sf);
+            op.zero = &zero;
+            RunRows<T, L, K>(op, a, aStep, b, bStep, d, dStep, roi, value);
+        };
+        if constexpr (std::is_floating_point_v<Element<T>>) {
+            run();
+        } else {
+            // (16sc quotients in double lanes rely on rounding to nearest too)
+            FpGuard nearest(FpRound::kNearest);
+            run();
+        }
     } else {
         // The exactness argument above needs quotients rounded to nearest:
         // under a caller's directed rounding, 16u at scale factor -7 missed

@@ -328,6 +328,41 @@ TEST(Div, IntegerZeroDivisorAndExtremeScaleFactors)
     EXPECT_EQ(qc[0].im, std::numeric_limits<Pvx32s>::max());
 }
 
+// 16sc quotients: every pairing of parts from the extremes (numerators and
+// divisors that fill 32 bits, zero divisors) at every scale factor where
+// results differ, and small dividends over large divisors, whose quotients
+// stay below saturation far down the negative scale factors.
+TEST(Div, ComplexExtremes16sc)
+{
+    const Pvx16s parts[] = {-32768, -32767, -16384, -3, -1, 0, 1, 2, 16384, 32767};
+    std::vector<Pvx16sc> den, num;
+    for (Pvx16s p : parts)
+        for (Pvx16s q : parts)
+            for (Pvx16s r : parts)
+                for (Pvx16s s : parts) {
+                    den.push_back({p, q});
+                    num.push_back({r, s});
+                }
+    Rng rng = MakeRng(21);
+    for (int i = 0; i < 4000; ++i) {
+        den.push_back({RandomElem<Pvx16s>(rng), RandomElem<Pvx16s>(rng)});
+        const int top = 1 << RandInt(rng, 0, 12);
+        num.push_back({static_cast<Pvx16s>(RandInt(rng, -top, top)), static_cast<Pvx16s>(RandInt(rng, -top, top))});
+    }
+    const int n = static_cast<int>(den.size());
+    std::vector<Pvx16sc> q(n);
+    for (int sf = -50; sf <= 34; ++sf) {
+        SCOPED_TRACE(sf);
+        ASSERT_EQ(pvxiDiv_16sc_C1RSfs(den.data(), 4 * n, num.data(), 4 * n, q.data(), 4 * n, {n, 1}, sf),
+                  pvxStsDivByZero);
+        for (int i = 0; i < n; ++i) {
+            Pvx16sc want = RefDiv<Pvx16sc>(num[i], den[i], sf, 1);
+            ASSERT_TRUE(q[i].re == want.re && q[i].im == want.im)
+                << i << ": (" << num[i].re << ", " << num[i].im << ") / (" << den[i].re << ", " << den[i].im << ")";
+        }
+    }
+}
+
 // The integer rules are exact whatever rounding the caller has set: quotients
 // that lie close to a rounding boundary, under each directed mode, and the
 // caller's mode back after the call.
