@@ -188,6 +188,16 @@ inline VI SllI16n(VI v, int n) { return _mm_slli_epi16(v, n); }
 inline VI SraI32n(VI v, int n) { return _mm_srai_epi32(v, n); }
 inline VI SllI32n(VI v, int n) { return _mm_slli_epi32(v, n); }
 inline int MaskBytes(VI a) { return _mm_movemask_epi8(a); }
+// 64-bit lanes
+inline VI AddI64(VI a, VI b) { return _mm_add_epi64(a, b); }
+inline VI SubI64(VI a, VI b) { return _mm_sub_epi64(a, b); }
+inline VI MulEvenI32(VI a, VI b) { return _mm_mul_epi32(a, b); }  // lanes 0 and 2, signed, to 64 bits
+inline VI EqI64(VI a, VI b) { return _mm_cmpeq_epi64(a, b); }
+inline VI GtI64(VI a, VI b) { return _mm_cmpgt_epi64(a, b); }  // signed
+inline VI SllI64(VI v, VI n) { return _mm_sll_epi64(v, n); }
+inline VI SrlI64(VI v, VI n) { return _mm_srl_epi64(v, n); }
+inline VI SrlI64n(VI v, int n) { return _mm_srli_epi64(v, n); }
+inline VI SllI64n(VI v, int n) { return _mm_slli_epi64(v, n); }
 
 // ---- widening and narrowing ----
 inline VI WidenLoU8(VI v) { return _mm_cvtepu8_epi16(v); }

@@ -14,28 +14,39 @@ using mul::MulX;
 // Complex product of integer parts: re = ac - bd, im = ad + bc, exact in wide
 // integers, each part under the scale-factor rule.
 //
-// 16sc has a vector path in 32-bit lanes, four numbers a register. Both
-// parts are exact there: ac and bd come from multiply-adds with one half of
-// each pair masked off, and ac - bd lies within (-2^31, 2^31); ad + bc comes
-// from one multiply-add with c and d swapped and reaches 2^31, which wraps to
-// -2^31, only when all four parts are -32768 (no other sum comes near -2^31),
-// so that lane is set to 2^31 - 1, which every scale factor rounds and
-// saturates as it does 2^31. As the parts use all 32 bits, the rounding
-// compares the remainder with the halfway point instead of adding before the
-// shift (that addition would overflow).
+// 16sc runs four numbers a register in 32-bit lanes, 32sc two in 64-bit
+// lanes; both parts are exact there. ac - bd comes from two products (16sc:
+// multiply-adds with one half of each pair masked off) and lies strictly
+// inside the lane's range; ad + bc reaches 2^31 (2^63 for 32sc), which wraps
+// to the lane's minimum, only when all four parts are the type's minimum (no
+// other sum comes near the minimum), so that lane is set to the lane's
+// maximum, which every scale factor rounds and saturates as it does the
+// true sum. As the parts use all the lane's bits, the rounding compares the
+// remainder with the halfway point instead of adding before the shift (that
+// addition would overflow).
 template <class T, Sf M>
 struct CMulIntOp {
     using Unit = T;
     using E = Element<T>;
-    static constexpr bool kHasVector = std::is_same_v<T, Pvx16sc>;
+    static constexpr bool kWide = sizeof(E) == 4;  // 64-bit lanes
+    static constexpr bool kHasVector = true;
     SfsK k;
-    VI lowBits, halfway;  // sf 1 to 31: 2^sf - 1, 2^(sf-1)
-    // (sf 32 and above never get here: every result is 0, filled before)
-    explicit CMulIntOp(int s) : k(MakeSfsK<E>(s, M)), lowBits(Zero()), halfway(Zero())
+    VI cnt, lowBits, halfway;  // down: sf, 2^sf - 1, 2^(sf-1) in the lanes; up: the shift
+    // (sf from 2 log2 of the type's range up never gets here: every result
+    // is 0, filled before)
+    explicit CMulIntOp(int s) : k(MakeSfsK<E>(s, M)), cnt(k.cnt), lowBits(Zero()), halfway(Zero())
     {
-        if (M == Sf::kDown && s < 32) {
-            lowBits = SplatU32(static_cast<std::uint32_t>((std::uint64_t{1} << s) - 1));
-            halfway = SplatU32(std::uint32_t{1} << (s - 1));
+        if (M == Sf::kDown) {
+            if constexpr (kWide) {
+                cnt = ShiftCount(s);
+                lowBits = SplatU64((std::uint64_t{1} << s) - 1);
+                halfway = SplatU64(std::uint64_t{1} << (s - 1));
+            } else {
+                lowBits = SplatU32(static_cast<std::uint32_t>((std::uint64_t{1} << s) - 1));
+                halfway = SplatU32(std::uint32_t{1} << (s - 1));
+            }
+        } else if (M == Sf::kUp && kWide) {
+            cnt = ShiftCount(s < -31 ? 31 : -s);
         }
     }
     bool Vector() const { return kHasVector; }
@@ -46,25 +57,53 @@ struct CMulIntOp {
     }
     VI Vec(VI x, VI y) const
     {
-        const VI re = SplatU32(0xFFFF);
-        const VI swap = _mm_setr_epi8(2, 3, 0, 1, 6, 7, 4, 5, 10, 11, 8, 9, 14, 15, 12, 13);
-        const VI pairs = _mm_setr_epi8(0, 1, 8, 9, 2, 3, 10, 11, 4, 5, 12, 13, 6, 7, 14, 15);
-        VI r = SubI32(MulAddPairsI16(And(x, re), y), MulAddPairsI16(AndNot(re, x), y));
-        VI i = MulAddPairsI16(x, ShuffleBytes(y, swap));
-        i = Xor(i, EqI32(i, SplatU32(0x80000000u)));
-        return ShuffleBytes(PackSsS32(Scale(r), Scale(i)), pairs);
+        if constexpr (kWide) {
+            VI xo = SrlI64n(x, 32), yo = SrlI64n(y, 32);  // b and d in the even lanes
+            VI r = SubI64(MulEvenI32(x, y), MulEvenI32(xo, yo));
+            VI i = AddI64(MulEvenI32(x, yo), MulEvenI32(xo, y));
+            i = Xor(i, EqI64(i, SplatU64(std::uint64_t{1} << 63)));
+            return _mm_blend_epi16(Scale64(r), SllI64n(Scale64(i), 32), 0xCC);
+        } else {
+            const VI re = SplatU32(0xFFFF);
+            const VI swap = _mm_setr_epi8(2, 3, 0, 1, 6, 7, 4, 5, 10, 11, 8, 9, 14, 15, 12, 13);
+            const VI pairs = _mm_setr_epi8(0, 1, 8, 9, 2, 3, 10, 11, 4, 5, 12, 13, 6, 7, 14, 15);
+            VI r = SubI32(MulAddPairsI16(And(x, re), y), MulAddPairsI16(AndNot(re, x), y));
+            VI i = MulAddPairsI16(x, ShuffleBytes(y, swap));
+            i = Xor(i, EqI32(i, SplatU32(0x80000000u)));
+            return ShuffleBytes(PackSsS32(Scale32(r), Scale32(i)), pairs);
+        }
     }
     // Any 32-bit exact part: down by the floor and a rounding step, up by
     // the clamped shift; the pack saturates.
-    VI Scale(VI v) const
+    VI Scale32(VI v) const
     {
         if constexpr (M == Sf::kDown) {
             VI q = SraI32(v, k.cnt);
             VI inc = GtI32(And(v, lowBits), SubI32(halfway, And(q, k.one32)));
             return SubI32(q, inc);
         } else {
-            return Scale32<M>(v, k);
+            return pvx::Scale32<M>(v, k);
         }
+    }
+    // Any 64-bit exact part, scaled the same way (the floor from a logical
+    // shift between sign flips; up: clamped to +-2^31 first, beyond which
+    // every shift saturates) and saturated to 32 bits in the low half.
+    VI Scale64(VI v) const
+    {
+        const VI top = SplatU64(0x7FFFFFFF), bottom = SplatU64(0xFFFFFFFF80000000u);
+        if constexpr (M == Sf::kDown) {
+            VI sign = GtI64(Zero(), v);
+            VI q = Xor(SrlI64(Xor(v, sign), cnt), sign);
+            VI inc = GtI64(And(v, lowBits), SubI64(halfway, And(q, SplatU64(1))));
+            v = SubI64(q, inc);
+        } else if constexpr (M == Sf::kUp) {
+            const VI up = SplatU64(0x80000000u), down = SplatU64(0xFFFFFFFF80000000u);
+            v = SelectBytes(v, up, GtI64(v, up));
+            v = SelectBytes(v, down, GtI64(down, v));
+            v = SllI64(v, cnt);
+        }
+        v = SelectBytes(v, top, GtI64(v, top));
+        return SelectBytes(v, bottom, GtI64(bottom, v));
     }
 };
 

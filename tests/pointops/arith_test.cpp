@@ -393,30 +393,40 @@ TEST(Mul, ComplexProduct)
 }
 
 // Every pairing of parts from the extremes and their neighbours, in rows long
-// enough for whole registers: the sums that reach 2^31 (all four parts
-// -32768) or come near it, and ties, at every scale factor where they differ.
-TEST(Mul, ComplexExtremes16sc)
+// enough for whole registers: the sums that reach 2^31 or 2^63 (all four parts
+// the minimum) or come near it, and ties, at every scale factor where they
+// differ.
+template <class T, class F>
+void ComplexExtremes(int sfFrom, int sfTo, F mul)
 {
-    const Pvx16s parts[] = {-32768, -32767, -16384, -3, -1, 0, 1, 2, 16384, 32767};
-    std::vector<Pvx16sc> a, b;
-    for (Pvx16s p : parts)
-        for (Pvx16s q : parts)
-            for (Pvx16s r : parts)
-                for (Pvx16s s : parts) {
+    using E = ElemT<T>;
+    using L = std::numeric_limits<E>;
+    const E parts[] = {L::min(), L::min() + 1, L::min() / 2, -3, -1, 0, 1, 2, L::max() / 2 + 1, L::max()};
+    std::vector<T> a, b;
+    for (E p : parts)
+        for (E q : parts)
+            for (E r : parts)
+                for (E s : parts) {
                     a.push_back({p, q});
                     b.push_back({r, s});
                 }
-    const int n = static_cast<int>(a.size());
-    std::vector<Pvx16sc> d(n);
-    for (int sf = -17; sf <= 33; ++sf) {
+    const int n = static_cast<int>(a.size()), step = n * static_cast<int>(sizeof(T));
+    std::vector<T> d(n);
+    for (int sf = sfFrom; sf <= sfTo; ++sf) {
         SCOPED_TRACE(sf);
-        ASSERT_EQ(pvxiMul_16sc_C1RSfs(a.data(), 4 * n, b.data(), 4 * n, d.data(), 4 * n, {n, 1}, sf), pvxStsNoErr);
+        ASSERT_EQ(mul(a.data(), step, b.data(), step, d.data(), step, PvxiSize{n, 1}, sf), pvxStsNoErr);
         for (int i = 0; i < n; ++i) {
-            Pvx16sc want = pvxref::RefBin(Bin::kMul, a[i], b[i], sf);
+            T want = pvxref::RefBin(Bin::kMul, a[i], b[i], sf);
             ASSERT_TRUE(d[i].re == want.re && d[i].im == want.im)
                 << i << ": (" << a[i].re << ", " << a[i].im << ") (" << b[i].re << ", " << b[i].im << ")";
         }
     }
+}
+
+TEST(Mul, ComplexExtremes)
+{
+    ComplexExtremes<Pvx16sc>(-17, 33, pvxiMul_16sc_C1RSfs);
+    ComplexExtremes<Pvx32sc>(-33, 65, pvxiMul_32sc_C1RSfs);
 }
 
 TEST(Mul, ZeroFromScaleFactor17For8u)
