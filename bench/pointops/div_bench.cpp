@@ -1,12 +1,15 @@
 // Div_32f against cv::divide of two images, DivC_16u with a scale factor
-// against cv::divide by a scalar. OpenCV rounds its 16u quotient in its own
-// way, so the agree check compares pvx with the exact quotient and OpenCV
-// with pvx to within one.
+// against cv::divide by a scalar, and the complex products and quotients of
+// Mul_32fc and Div_32fc against mulSpectrums and divSpectrums. OpenCV rounds
+// its 16u quotient in its own way, so the agree check compares pvx with the
+// exact quotient and OpenCV with pvx to within one.
 #include <opencv2/core.hpp>
+#include <opencv2/imgproc.hpp>
 
 #include <cmath>
 #include <cstring>
 #include <memory>
+#include <vector>
 
 #include "bench.h"
 #include "pvxi.h"
@@ -78,6 +81,49 @@ PVX_BENCH_CASES(DivCases)
                     if (std::abs(static_cast<int>(b->ref.at<Pvx16u>(y, x)) - static_cast<int>(q)) > 1) return false;
                 }
             return true;
+        };
+        Register(c);
+    }
+    // Complex frames: two-channel float images are the peer's spectra. The
+    // peer's quotient takes its own operation order, hence the tolerance.
+    for (bool quot : {false, true}) {
+        struct Bufs {
+            cv::Mat a, b, dst, ref;
+            std::vector<std::uint8_t> from, to;  // memcpy: half the bytes moved
+        };
+        auto b = std::make_shared<Bufs>();
+        b->from.resize(px * 12, 1);
+        b->to.resize(px * 12);
+        b->a.create(f.height, f.width, CV_32FC2);
+        b->b.create(f.height, f.width, CV_32FC2);
+        cv::randu(b->a, -300.0, 300.0);
+        cv::randu(b->b, 0.5, 300.0);
+        b->dst.create(f.height, f.width, CV_32FC2);
+        b->ref.create(f.height, f.width, CV_32FC2);
+        Case c;
+        c.name = std::string(quot ? "Div_32fc_C1R/" : "Mul_32fc_C1R/") + f.label;
+        c.bytes = px * 24;
+        auto ptr = [](cv::Mat& m) { return m.ptr<Pvx32fc>(); };
+        auto step = [](const cv::Mat& m) { return static_cast<int>(m.step); };
+        if (quot) {
+            // a / b: the first image is the divisor
+            c.pvx = [b, roi, ptr, step] {
+                pvxiDiv_32fc_C1R(ptr(b->b), step(b->b), ptr(b->a), step(b->a), ptr(b->dst), step(b->dst), roi);
+            };
+            c.peer = [b] { cv::divSpectrums(b->a, b->b, b->ref, 0); };
+        } else {
+            c.pvx = [b, roi, ptr, step] {
+                pvxiMul_32fc_C1R(ptr(b->a), step(b->a), ptr(b->b), step(b->b), ptr(b->dst), step(b->dst), roi);
+            };
+            c.peer = [b] { cv::mulSpectrums(b->a, b->b, b->ref, 0); };
+        }
+        c.memref = [b] { std::memcpy(b->to.data(), b->from.data(), b->from.size()); };
+        c.agree = [c, b] {
+            c.pvx();
+            c.peer();
+            // parts of up to 300 squared cancel in ac - bd: absolute room too
+            cv::Mat diff = cv::abs(b->dst - b->ref), tol = cv::abs(b->ref) * 1e-5 + 0.05;
+            return cv::countNonZero(diff.reshape(1) > tol.reshape(1)) == 0;
         };
         Register(c);
     }
