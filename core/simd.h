@@ -188,6 +188,14 @@ inline VI SllI16n(VI v, int n) { return _mm_slli_epi16(v, n); }
 inline VI SraI32n(VI v, int n) { return _mm_srai_epi32(v, n); }
 inline VI SllI32n(VI v, int n) { return _mm_slli_epi32(v, n); }
 inline int MaskBytes(VI a) { return _mm_movemask_epi8(a); }
+// The two 16-bit halves of every 32-bit lane exchanged (the parts of 16sc).
+inline VI SwapHalves16(VI v) { return ShuffleBytes(v, _mm_setr_epi8(2, 3, 0, 1, 6, 7, 4, 5, 10, 11, 8, 9, 14, 15, 12, 13)); }
+// The 32-bit lanes of a and b packed with signed saturation into alternating
+// 16-bit lanes: a0 b0 a1 b1 a2 b2 a3 b3 (the parts of 16sc).
+inline VI PackPairsS32(VI a, VI b)
+{
+    return ShuffleBytes(_mm_packs_epi32(a, b), _mm_setr_epi8(0, 1, 8, 9, 2, 3, 10, 11, 4, 5, 12, 13, 6, 7, 14, 15));
+}
 // 64-bit lanes
 inline VI AddI64(VI a, VI b) { return _mm_add_epi64(a, b); }
 inline VI SubI64(VI a, VI b) { return _mm_sub_epi64(a, b); }

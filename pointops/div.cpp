@@ -336,9 +336,7 @@ struct CplxDivOp {
     VI VecS16(VI x, VI y, VI keep) const
     {
         const VI re = SplatU32(0xFFFF);
-        const VI swap = _mm_setr_epi8(2, 3, 0, 1, 6, 7, 4, 5, 10, 11, 8, 9, 14, 15, 12, 13);
-        const VI pairs = _mm_setr_epi8(0, 1, 8, 9, 2, 3, 10, 11, 4, 5, 12, 13, 6, 7, 14, 15);
-        VI ys = ShuffleBytes(y, swap);
+        VI ys = SwapHalves16(y);
         VI nr = MulAddPairsI16(x, y);                                                     // ac + bd
         VI ni = SubI32(MulAddPairsI16(AndNot(re, x), ys), MulAddPairsI16(And(x, re), ys));  // bc - ad
         VI m = MulAddPairsI16(y, y);                                                      // c^2 + d^2
@@ -357,7 +355,7 @@ struct CplxDivOp {
             return SatI32<E, Rnd::kEven>(DivD(MulD(d(CvtLoI32D(n)), scaleD), ml),
                                          DivD(MulD(d(CvtHiI32D(n)), scaleD), mh));
         };
-        return ShuffleBytes(PackSsS32(quot(nr), quot(ni)), pairs);
+        return PackPairsS32(quot(nr), quot(ni));
     }
 
     T Scalar(T a, T b) const

@@ -65,12 +65,10 @@ struct CMulIntOp {
             return _mm_blend_epi16(Scale64(r), SllI64n(Scale64(i), 32), 0xCC);
         } else {
             const VI re = SplatU32(0xFFFF);
-            const VI swap = _mm_setr_epi8(2, 3, 0, 1, 6, 7, 4, 5, 10, 11, 8, 9, 14, 15, 12, 13);
-            const VI pairs = _mm_setr_epi8(0, 1, 8, 9, 2, 3, 10, 11, 4, 5, 12, 13, 6, 7, 14, 15);
             VI r = SubI32(MulAddPairsI16(And(x, re), y), MulAddPairsI16(AndNot(re, x), y));
-            VI i = MulAddPairsI16(x, ShuffleBytes(y, swap));
+            VI i = MulAddPairsI16(x, SwapHalves16(y));
             i = Xor(i, EqI32(i, SplatU32(0x80000000u)));
-            return ShuffleBytes(PackSsS32(Scale32(r), Scale32(i)), pairs);
+            return PackPairsS32(Scale32(r), Scale32(i));
         }
     }
     // Any 32-bit exact part: down by the floor and a rounding step, up by

@@ -86,6 +86,23 @@ E RandomElem(Rng& rng)
     }
 }
 
+// Every pairing of two complex numbers whose parts come from the type's
+// extremes, their neighbours and small values (10^4 pairs), appended to x and y.
+template <class T>
+void AppendExtremePairs(std::vector<T>& x, std::vector<T>& y)
+{
+    using E = decltype(T{}.re);
+    using L = std::numeric_limits<E>;
+    const E parts[] = {L::min(), L::min() + 1, L::min() / 2, -3, -1, 0, 1, 2, L::max() / 2 + 1, L::max()};
+    for (E p : parts)
+        for (E q : parts)
+            for (E r : parts)
+                for (E s : parts) {
+                    x.push_back({p, q});
+                    y.push_back({r, s});
+                }
+}
+
 template <class E>
 void FillRandom(E* p, std::size_t n, Rng& rng)
 {

@@ -399,17 +399,8 @@ TEST(Mul, ComplexProduct)
 template <class T, class F>
 void ComplexExtremes(int sfFrom, int sfTo, F mul)
 {
-    using E = ElemT<T>;
-    using L = std::numeric_limits<E>;
-    const E parts[] = {L::min(), L::min() + 1, L::min() / 2, -3, -1, 0, 1, 2, L::max() / 2 + 1, L::max()};
     std::vector<T> a, b;
-    for (E p : parts)
-        for (E q : parts)
-            for (E r : parts)
-                for (E s : parts) {
-                    a.push_back({p, q});
-                    b.push_back({r, s});
-                }
+    AppendExtremePairs(a, b);
     const int n = static_cast<int>(a.size()), step = n * static_cast<int>(sizeof(T));
     std::vector<T> d(n);
     for (int sf = sfFrom; sf <= sfTo; ++sf) {

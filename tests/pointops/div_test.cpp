@@ -334,15 +334,8 @@ TEST(Div, IntegerZeroDivisorAndExtremeScaleFactors)
 // stay below saturation far down the negative scale factors.
 TEST(Div, ComplexExtremes16sc)
 {
-    const Pvx16s parts[] = {-32768, -32767, -16384, -3, -1, 0, 1, 2, 16384, 32767};
     std::vector<Pvx16sc> den, num;
-    for (Pvx16s p : parts)
-        for (Pvx16s q : parts)
-            for (Pvx16s r : parts)
-                for (Pvx16s s : parts) {
-                    den.push_back({p, q});
-                    num.push_back({r, s});
-                }
+    AppendExtremePairs(den, num);
     Rng rng = MakeRng(21);
     for (int i = 0; i < 4000; ++i) {
         den.push_back({RandomElem<Pvx16s>(rng), RandomElem<Pvx16s>(rng)});
