@@ -76,7 +76,7 @@ struct CMulIntOp {
     VI Scale32(VI v) const
     {
         if constexpr (M == Sf::kDown) {
-            VI q = SraI32(v, k.cnt);
+            VI q = SraI32(v, cnt);
             VI inc = GtI32(And(v, lowBits), SubI32(halfway, And(q, k.one32)));
             return SubI32(q, inc);
         } else {
@@ -95,9 +95,9 @@ struct CMulIntOp {
             VI inc = GtI64(And(v, lowBits), SubI64(halfway, And(q, SplatU64(1))));
             v = SubI64(q, inc);
         } else if constexpr (M == Sf::kUp) {
-            const VI up = SplatU64(0x80000000u), down = SplatU64(0xFFFFFFFF80000000u);
+            const VI up = SplatU64(0x80000000u);
             v = SelectBytes(v, up, GtI64(v, up));
-            v = SelectBytes(v, down, GtI64(down, v));
+            v = SelectBytes(v, bottom, GtI64(bottom, v));
             v = SllI64(v, cnt);
         }
         v = SelectBytes(v, top, GtI64(v, top));
