@@ -308,12 +308,21 @@ struct CplxDivOp {
     bool Vector() const { return kHasVector; }
 
     // A constant divisor has no zero part pair (the call refused it).
-    VI Vec(VI a, VI b) const { return Vec(a, b, Zero()); }
+    [[gnu::always_inline]] VI Vec(VI a, VI b) const { return Vec(a, b, Zero()); }
     // keep: the alpha lanes of AC4, whose divisors are not looked at.
-    VI Vec(VI a, VI b, VI keep) const
+    [[gnu::always_inline]] VI Vec(VI a, VI b, VI keep) const
     {
         if constexpr (kS16) return VecS16(kConst ? a : b, kConst ? b : a, keep);
-        VF num = AsFloat(kConst ? a : b), den = AsFloat(kConst ? b : a);
+        else return VecF(kConst ? a : b, kConst ? b : a, keep);
+    }
+
+    // Each takes the dividend, then the divisor. The 32fc one is inlined
+    // into the row loop, where a call per register had been left (rows in
+    // cache 1.2 times faster); the 16sc one measured 1.4 times slower
+    // inlined, so it stays the compiler's choice.
+    [[gnu::always_inline]] VI VecF(VI a, VI b, VI keep) const
+    {
+        VF num = AsFloat(a), den = AsFloat(b);
         VF p = MulF(num, den);               // ac, bd
         VF t = MulF(num, SwapPairsF(den));   // ad, bc
         VF dd = MulF(den, den);
