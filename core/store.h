@@ -36,4 +36,16 @@ inline bool StreamWorkingSet(std::int64_t bytesTouched)
     return bytesTouched >= cache / 2;
 }
 
+// The choice of fetching in software the streams that the hardware
+// prefetchers do not follow (rows taken in falling order): worth its load
+// slots once the working set is unlikely to be in the cache, taken as a
+// quarter of the largest cache read and written (a shared cache is shared).
+inline bool FetchAhead(std::int64_t bytesTouched)
+{
+    if (bytesTouched <= kNtThresholdLarge) return false;
+    int cache = 0;
+    if (pvxGetMaxCacheSizeB(&cache) != pvxStsNoErr) return false;
+    return bytesTouched >= cache / 4;
+}
+
 }  // namespace pvx

@@ -114,6 +114,24 @@ inline void Put(Bytes* p, VI v)
     else StoreU(p, v);
 }
 
+// Flip 0 takes one of its two source rows, and writes one of its two
+// destination rows, in falling order, which the hardware prefetchers do not
+// follow. On large regions the row pair fetches the next such rows, a line
+// each 64 bytes copied (1080p 8u C4: about 1.25 times faster; fetching only
+// the first lines of each row gained a third of that). When the region is in
+// the cache the fetches only take load slots (8 MB: 1.07 times slower), and
+// the reversed flips, which have more work per byte, gained nothing. dst is
+// null when the stores are streamed.
+struct RowsAhead {
+    const Bytes* src;
+    const Bytes* dst;
+    void At(std::ptrdiff_t srcOffset, std::ptrdiff_t dstOffset) const
+    {
+        Prefetch(src + srcOffset);
+        if (dst) Prefetch(dst + dstOffset);
+    }
+};
+
 // Copies n bytes of one row (flip 0), 64 bytes a step; AC4 blends the
 // destination alpha back (n and the start are whole pixels there). Streaming
 // stores start where the destination is aligned (AC4 rows are streamed only
@@ -144,11 +162,13 @@ void CopyRow(const Bytes* s, Bytes* d, std::ptrdiff_t n, VI alpha)
 // that run interleaved measured 1.2 to 1.6 times faster than one row after
 // the other on frames of 8 MB and more (rows taken from the bottom up alone
 // are the slow case).
-template <class Px, bool kAlpha, int S>
-void CopyRowPair(const Bytes* s0, Bytes* d0, const Bytes* s1, Bytes* d1, std::ptrdiff_t n, VI alpha)
+template <class Px, bool kAlpha, int S, bool kAhead>
+void CopyRowPair(const Bytes* s0, Bytes* d0, const Bytes* s1, Bytes* d1, std::ptrdiff_t n, VI alpha, RowsAhead ahead)
 {
     std::ptrdiff_t i = 0;
     for (; i + 32 <= n; i += 32) {
+        if constexpr (kAhead)
+            if ((i & 63) == 0) ahead.At(i, i);
         VI a0 = LoadU(s0 + i), a1 = LoadU(s0 + i + 16), b0 = LoadU(s1 + i), b1 = LoadU(s1 + i + 16);
         if constexpr (kAlpha) {
             a0 = SelectBytes(a0, LoadU(d0 + i), alpha);
@@ -387,6 +407,7 @@ void MirrorRows(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdiff_t 
     const VI alpha = Px::AlphaMask();
     const int h = roi.height;
     const std::ptrdiff_t width = roi.width, n = width * Px::kSize;
+    const bool ahead = FetchAhead(2 * n * h);
     for (int y = 0; y <= h - 1 - y; ++y) {
         int y2 = h - 1 - y;
         const Bytes* s0 = src + ss * (flip == 1 ? y : y2);
@@ -400,9 +421,12 @@ void MirrorRows(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdiff_t 
         }
         bool aligned = IsAligned(d0) && IsAligned(d1);
         if (flip == 0) {
-            if (aligned && nt) CopyRowPair<Px, kAlpha, kStream>(s0, d0, s1, d1, n, alpha);
-            else if (aligned) CopyRowPair<Px, kAlpha, kAligned>(s0, d0, s1, d1, n, alpha);
-            else CopyRowPair<Px, kAlpha, kUnaligned>(s0, d0, s1, d1, n, alpha);
+            RowsAhead next{src + ss * (y2 - 1), nt ? nullptr : d1 - ds};
+            if (aligned && nt) CopyRowPair<Px, kAlpha, kStream, true>(s0, d0, s1, d1, n, alpha, next);
+            else if (aligned && ahead) CopyRowPair<Px, kAlpha, kAligned, true>(s0, d0, s1, d1, n, alpha, next);
+            else if (aligned) CopyRowPair<Px, kAlpha, kAligned, false>(s0, d0, s1, d1, n, alpha, next);
+            else if (ahead) CopyRowPair<Px, kAlpha, kUnaligned, true>(s0, d0, s1, d1, n, alpha, next);
+            else CopyRowPair<Px, kAlpha, kUnaligned, false>(s0, d0, s1, d1, n, alpha, next);
         } else {
             if (aligned && nt) ReverseRowPair<Px, kAlpha, kStream>(s0, d0, s1, d1, width, plan, alpha);
             else if (aligned) ReverseRowPair<Px, kAlpha, kAligned>(s0, d0, s1, d1, width, plan, alpha);

@@ -82,18 +82,22 @@ template <class T>
 void MirrorLarge(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int), bool alpha, int w, int h, std::uint64_t seed)
 {
     Rng rng = MakeRng(seed);
-    for (int flip = 0; flip < 3; ++flip)
-        for (bool aligned : {true, false}) {
-            SCOPED_TRACE(::testing::Message() << "Mirror " << sizeof(T) << "-byte " << (alpha ? "AC4" : "C4") << " "
-                                              << w << "x" << h << " flip " << flip << " aligned " << aligned);
-            ShapeOptions o{!aligned, !aligned, false, 0};
-            GuardedImage src = MakeImage<T>(w, h, 4, rng, o), dst = MakeImage<T>(w, h, 4, rng, o);
-            const auto dstBefore = dst.Packed<T>();  // AC4 keeps its alpha
-            SmallCache cache(kCache);
-            ASSERT_EQ(fn(src.ptr<T>(), src.step(), dst.ptr<T>(), dst.step(), {w, h}, flip), pvxStsNoErr);
-            EXPECT_GT(gCacheQueries.load(), 0);
-            EXPECT_TRUE(RegionEquals(dst, RefMirror(src.Packed<T>(), dstBefore, w, h, 4, alpha, flip)));
-        }
+    // The larger cache keeps ordinary stores but still fetches the falling
+    // rows of flip 0 ahead.
+    for (int cacheBytes : {kCache, 4 * kCache})
+        for (int flip = 0; flip < 3; ++flip)
+            for (bool aligned : {true, false}) {
+                SCOPED_TRACE(::testing::Message() << "Mirror " << sizeof(T) << "-byte " << (alpha ? "AC4" : "C4") << " "
+                                                  << w << "x" << h << " flip " << flip << " aligned " << aligned
+                                                  << " cache " << cacheBytes);
+                ShapeOptions o{!aligned, !aligned, false, 0};
+                GuardedImage src = MakeImage<T>(w, h, 4, rng, o), dst = MakeImage<T>(w, h, 4, rng, o);
+                const auto dstBefore = dst.Packed<T>();  // AC4 keeps its alpha
+                SmallCache cache(cacheBytes);
+                ASSERT_EQ(fn(src.ptr<T>(), src.step(), dst.ptr<T>(), dst.step(), {w, h}, flip), pvxStsNoErr);
+                EXPECT_GT(gCacheQueries.load(), 0);
+                EXPECT_TRUE(RegionEquals(dst, RefMirror(src.Packed<T>(), dstBefore, w, h, 4, alpha, flip)));
+            }
 }
 
 TEST(MoveStreaming, MirrorLargeFourChannelRegions)
