@@ -39,7 +39,7 @@ inline bool StreamWorkingSet(std::int64_t bytesTouched)
 // The choice of fetching in software the streams that the hardware
 // prefetchers do not follow (rows taken in falling order): worth its load
 // slots once the working set is unlikely to be in the cache, taken as a
-// quarter of the largest cache read and written (a shared cache is shared).
+// quarter of the largest cache read and written (other cores share it).
 inline bool FetchAhead(std::int64_t bytesTouched)
 {
     if (bytesTouched <= kNtThresholdLarge) return false;
