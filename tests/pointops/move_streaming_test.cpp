@@ -110,6 +110,29 @@ TEST(MoveStreaming, MirrorLargeFourChannelRegions)
     MirrorLarge(pvxiMirror_32s_AC4R, true, 181, 190, 16);
 }
 
+// In place, flip 0 fetches its falling rows ahead on large regions too.
+template <class T>
+void MirrorInPlaceLarge(PvxStatus (*fn)(T*, int, PvxiSize, int), bool alpha, int w, int h, std::uint64_t seed)
+{
+    Rng rng = MakeRng(seed);
+    for (int flip : {0, 2}) {
+        SCOPED_TRACE(::testing::Message() << "Mirror in place " << sizeof(T) << "-byte " << (alpha ? "AC4" : "C4")
+                                          << " flip " << flip);
+        GuardedImage img = MakeImage<T>(w, h, 4, rng);
+        const auto before = img.Packed<T>();
+        SmallCache cache(kCache);
+        ASSERT_EQ(fn(img.ptr<T>(), img.step(), {w, h}, flip), pvxStsNoErr);
+        EXPECT_GT(gCacheQueries.load(), 0);
+        EXPECT_TRUE(RegionEquals(img, RefMirror(before, before, w, h, 4, alpha, flip)));
+    }
+}
+
+TEST(MoveStreaming, MirrorInPlaceLargeRegions)
+{
+    MirrorInPlaceLarge(pvxiMirror_8u_C4IR, false, 401, 331, 17);
+    MirrorInPlaceLarge(pvxiMirror_16u_AC4IR, true, 199, 343, 18);
+}
+
 // Planes merged into pixels stream once what the call reads and writes
 // reaches the cache; the planes are stacked in one image, so they share its
 // step and the padding between its rows.
