@@ -158,6 +158,13 @@ inline VI AvgU8(VI a, VI b) { return _mm_avg_epu8(a, b); }     // (a + b + 1) >>
 inline VI AvgU16(VI a, VI b) { return _mm_avg_epu16(a, b); }   // (a + b + 1) >> 1
 inline VI MinU16(VI a, VI b) { return _mm_min_epu16(a, b); }
 inline VI MulAddPairsI16(VI a, VI b) { return _mm_madd_epi16(a, b); }  // a0*b0 + a1*b1 in 32 bits
+// a0*b0 - a1*b1 of each pair of 16-bit lanes, exact in 32 bits (the real
+// part of a 16sc product): two multiply-adds with one half masked off.
+inline VI MulSubPairsI16(VI a, VI b)
+{
+    const VI low = SplatU32(0xFFFF);
+    return SubI32(MulAddPairsI16(And(a, low), b), MulAddPairsI16(AndNot(low, a), b));
+}
 inline VI MulHiI16(VI a, VI b) { return _mm_mulhi_epi16(a, b); }
 inline VI MulHiU16(VI a, VI b) { return _mm_mulhi_epu16(a, b); }
 inline VI MinI16(VI a, VI b) { return _mm_min_epi16(a, b); }

@@ -44,6 +44,7 @@
 //
 // Checks: pointers (-8), sizes (-6), steps (-14); then DivC's constant (any
 // zero channel: pvxStsDivByZeroErr, -10) and Div_Round's mode (-213).
+#include <algorithm>
 #include <cstring>
 #include <limits>
 #include <type_traits>
@@ -301,7 +302,7 @@ struct CplxDivOp {
     bool* zero = nullptr;  // set when a zero divisor is met (the row loop copies the op)
 
     explicit CplxDivOp(int scaleFactor)
-        : sf(scaleFactor), scaleD(SplatD(Pow2D(scaleFactor > 40 ? -40 : scaleFactor < -46 ? 46 : -scaleFactor)))
+        : sf(scaleFactor), scaleD(SplatD(Pow2D(-std::clamp(scaleFactor, -46, 40))))
     {
     }
     static constexpr bool kHasVector = std::is_same_v<T, Pvx32fc> || kS16;
@@ -344,11 +345,9 @@ struct CplxDivOp {
 
     VI VecS16(VI x, VI y, VI keep) const
     {
-        const VI re = SplatU32(0xFFFF);
-        VI ys = SwapHalves16(y);
-        VI nr = MulAddPairsI16(x, y);                                                     // ac + bd
-        VI ni = SubI32(MulAddPairsI16(AndNot(re, x), ys), MulAddPairsI16(And(x, re), ys));  // bc - ad
-        VI m = MulAddPairsI16(y, y);                                                      // c^2 + d^2
+        VI nr = MulAddPairsI16(x, y);                  // ac + bd
+        VI ni = MulSubPairsI16(SwapHalves16(x), y);    // bc - ad
+        VI m = MulAddPairsI16(y, y);                   // c^2 + d^2
         if constexpr (!kConst) {
             VI z = AndNot(keep, EqI32(m, Zero()));
             if (MaskBytes(z)) [[unlikely]] {

@@ -411,7 +411,7 @@ void MirrorRows(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdiff_t 
     const VI alpha = Px::AlphaMask();
     const int h = roi.height;
     const std::ptrdiff_t width = roi.width, n = width * Px::kSize;
-    const bool ahead = FetchAhead(2 * n * h);
+    const bool ahead = flip == 0 && FetchAhead(2 * n * h);
     for (int y = 0; y <= h - 1 - y; ++y) {
         int y2 = h - 1 - y;
         const Bytes* s0 = src + ss * (flip == 1 ? y : y2);
@@ -450,7 +450,7 @@ void MirrorInPlace(Bytes* p, std::ptrdiff_t step, PvxiSize roi, int flip)
         for (int y = 0; y < h; ++y) ReverseRowInPlace<Px, kAlpha>(p + step * y, roi.width, plan, alpha);
         return;
     }
-    const bool ahead = FetchAhead(2 * static_cast<std::int64_t>(roi.width) * Px::kSize * h);
+    const bool ahead = flip == 0 && FetchAhead(2 * static_cast<std::int64_t>(roi.width) * Px::kSize * h);
     for (int y = 0; y < h - 1 - y; ++y) {
         Bytes* a = p + step * y;
         Bytes* b = p + step * (h - 1 - y);

@@ -64,8 +64,7 @@ struct CMulIntOp {
             i = Xor(i, EqI64(i, SplatU64(std::uint64_t{1} << 63)));
             return _mm_blend_epi16(Scale64(r), SllI64n(Scale64(i), 32), 0xCC);
         } else {
-            const VI re = SplatU32(0xFFFF);
-            VI r = SubI32(MulAddPairsI16(And(x, re), y), MulAddPairsI16(AndNot(re, x), y));
+            VI r = MulSubPairsI16(x, y);
             VI i = MulAddPairsI16(x, SwapHalves16(y));
             i = Xor(i, EqI32(i, SplatU32(0x80000000u)));
             return PackPairsS32(Scale32(r), Scale32(i));

@@ -110,7 +110,8 @@ TEST(MoveStreaming, MirrorLargeFourChannelRegions)
     MirrorLarge(pvxiMirror_32s_AC4R, true, 181, 190, 16);
 }
 
-// In place, flip 0 fetches its falling rows ahead on large regions too.
+// In place, flip 0 fetches its falling rows ahead on large regions too (and
+// asks for the cache size to decide); flip 2 exchanges reversed rows.
 template <class T>
 void MirrorInPlaceLarge(PvxStatus (*fn)(T*, int, PvxiSize, int), bool alpha, int w, int h, std::uint64_t seed)
 {
@@ -122,7 +123,9 @@ void MirrorInPlaceLarge(PvxStatus (*fn)(T*, int, PvxiSize, int), bool alpha, int
         const auto before = img.Packed<T>();
         SmallCache cache(kCache);
         ASSERT_EQ(fn(img.ptr<T>(), img.step(), {w, h}, flip), pvxStsNoErr);
-        EXPECT_GT(gCacheQueries.load(), 0);
+        if (flip == 0) {
+            EXPECT_GT(gCacheQueries.load(), 0);
+        }
         EXPECT_TRUE(RegionEquals(img, RefMirror(before, before, w, h, 4, alpha, flip)));
     }
 }
