@@ -134,9 +134,10 @@ TEST(Set, EveryMemberAgainstReference)
     }
 }
 
-// Regions of 64 KiB and more are filled by copying a filled block over the
-// rest: rows shorter and longer than the block, padded, contiguous and
-// bottom-up, with values whose bytes differ.
+// Long rows are filled by copying a filled block over the rest, and separate
+// rows as copies of the first: rows shorter and longer than the block,
+// padded, contiguous, bottom-up and all one row, with values whose bytes
+// differ.
 TEST(Set, LargeRegionsAgainstReference)
 {
     std::uint64_t seed = 900;
@@ -164,6 +165,16 @@ TEST(Set, LargeRegionsAgainstReference)
                 EXPECT_TRUE(RegionEquals(dst, want));
                 if (HasFatalFailure()) return;
             }
+            // A step of 0: every row is the first, which is filled again
+            // rather than copied onto itself.
+            GuardedImage row(s.width, 1, m.channels * m.elemBytes, m.elemBytes, rng, {});
+            row.Randomize<Pvx8u>(rng);
+            GuardedImage none(1, 1, 1, 1, rng, {});
+            std::vector<Pvx8u> value(4 * m.elemBytes, 0x5A);
+            value[0] = 0xA5;
+            auto want = Expected(m, row, none, value, 0);
+            ASSERT_EQ(m.call({value.data(), row.data(), 0, {s.width, s.height}, nullptr, 0}), pvxStsNoErr);
+            EXPECT_TRUE(RegionEquals(row, want)) << m.name << " width " << s.width << " step 0";
         }
     }
 }
