@@ -172,6 +172,39 @@ TEST(MoveStreaming, MergeLargeRegions)
     MergeLarge(pvxiCopy_32f_P3C3R, 3, 271, 251, 25);
 }
 
+// Pixels split into planes stream under the same rule; the planes share
+// one step and, unaligned, start at different offsets within a vector.
+template <class T>
+void SplitLarge(PvxStatus (*fn)(const T*, int, T* const*, int, PvxiSize), int ch, int w, int h, std::uint64_t seed)
+{
+    Rng rng = MakeRng(seed);
+    for (bool aligned : {true, false}) {
+        SCOPED_TRACE(::testing::Message() << "Split " << sizeof(T) << "-byte C" << ch << " " << w << "x" << h
+                                          << " aligned " << aligned);
+        ShapeOptions o{!aligned, !aligned, false, 0};
+        GuardedImage src = MakeImage<T>(w, h, ch, rng, o), planes = MakeImage<T>(w, h * ch, 1, rng, o);
+        GuardedImage want = planes;
+        T* p[4] = {};
+        for (int c = 0; c < ch; ++c) p[c] = planes.row<T>(c * h);
+        SmallCache cache(kCache);
+        ASSERT_EQ(fn(src.ptr<T>(), src.step(), p, planes.step(), {w, h}), pvxStsNoErr);
+        EXPECT_GT(gCacheQueries.load(), 0);
+        for (int y = 0; y < h; ++y)
+            for (int x = 0; x < w; ++x)
+                for (int c = 0; c < ch; ++c) want.row<T>(c * h + y)[x] = src.row<T>(y)[x * ch + c];
+        EXPECT_TRUE(RegionEquals(planes, want.Packed<T>()));
+    }
+}
+
+TEST(MoveStreaming, SplitLargeRegions)
+{
+    SplitLarge(pvxiCopy_8u_C3P3R, 3, 403, 331, 31);
+    SplitLarge(pvxiCopy_8u_C4P4R, 4, 333, 299, 32);
+    SplitLarge(pvxiCopy_16s_C3P3R, 3, 263, 255, 33);
+    SplitLarge(pvxiCopy_16u_C4P4R, 4, 213, 235, 34);
+    SplitLarge(pvxiCopy_32f_C4P4R, 4, 271, 251, 35);
+}
+
 // Dup streams like the merges (above 786433 bytes read and written); C1C4
 // writes every channel.
 void DupLarge(PvxStatus (*fn)(const Pvx8u*, int, Pvx8u*, int, PvxiSize), int ch, int w, int h, std::uint64_t seed)
