@@ -52,6 +52,7 @@
 #include "arith_round.h"
 #include "check.h"
 #include "forward.h"
+#include "fpguard.h"
 #include "layout.h"
 #include "sfs.h"
 #include "simd.h"
@@ -79,6 +80,7 @@ struct SfsK {
     simd::VI cnt;             // shift count: sf down, or min(-sf, bits of U) up
     simd::VI one16, half16;   // 16-bit lanes: 1, 2^(sf-1) - 1
     simd::VI tie16, tieAt16;  // 16-bit lanes, sf 1 to 15: 2^(sf+1) - 1, 2^(sf-1)
+    simd::VF down;            // float lanes, sf 1 to 40: 2^-sf
     simd::VI one32, half32;   // 32-bit lanes
     simd::VI lo16, hi16;      // shift-up clamps (lo - 1, hi + 1), 16-bit lanes
     simd::VI lo32, hi32;      // 32-bit lanes
@@ -95,8 +97,10 @@ inline SfsK MakeSfsK(int sf, Sf m)
     k.half16 = k.half32 = k.tie16 = k.tieAt16 = Zero();
     k.lo16 = k.hi16 = k.lo32 = k.hi32 = Zero();
     k.cnt = Zero();
+    k.down = SplatF(1.0f);
     if (m == Sf::kDown) {
         int s = sf > 40 ? 40 : sf;
+        k.down = SplatF(static_cast<float>(Pow2D(-s)));
         std::int64_t half = (std::int64_t{1} << (s - 1)) - 1;
         k.cnt = ShiftCount(s);
         k.half16 = _mm_set1_epi16(static_cast<short>(half & 0xFFFF));
@@ -272,6 +276,8 @@ concept HasHalf = requires(simd::VI a) { X::template Half<U>(a, a); };
 template <class X, class U>
 concept HasDown = requires(simd::VI a, const SfsK& k) { X::template Down<U>(a, a, k); };
 template <class X, class U>
+concept FloatDown = HasDown<X, U> && requires { requires X::template kFloatDown<U>; };
+template <class X, class U>
 concept HasExact32 = requires(simd::VI a, simd::VI* r) { X::template Exact32<U>(a, a, r); };
 
 // Integer op on elements U (8u, 16u, 16s, 32s) under the Sfs rule. The
@@ -284,6 +290,8 @@ struct IntOp {
     using Unit = U;
     static constexpr bool kHasVector = sizeof(U) <= 2 || X::kSum;
     static constexpr bool kHalfPath = HasHalf<X, U>;
+    // Ops that round in float lanes need the nearest rounding mode set.
+    static constexpr bool kRoundsInFloat = M == Sf::kDown && FloatDown<X, U>;
     SfsK k;
     simd::VD scaleD;  // 32s: 2^-sf
     bool vec;
@@ -770,6 +778,8 @@ template <class Fam, class T, Src2 K, Sf M>
 using OpOf = typename OpOfT<Fam, T, K, M>::type;
 template <class Op>
 concept HalfPathOp = requires { requires Op::kHalfPath; };
+template <class Op>
+concept RoundsInFloatOp = requires { requires Op::kRoundsInFloat; };
 
 // Runs the family's op over the region for the scale factor: zero fill above
 // the family's zero point, else the op for sf 0, down or up.
@@ -779,7 +789,13 @@ PvxStatus ArithRun(const T* a, int aStep, const T* b, int bStep, T* d, int dStep
 {
     auto run = [&]<Sf M>() {
         using Op = OpOf<Fam, T, K, M>;
-        RunRows<T, L, K>(Op(sf), a, aStep, b, bStep, d, dStep, roi, value);
+        if constexpr (RoundsInFloatOp<Op>) {
+            // (the caller's mode is restored on return)
+            FpGuard nearest(FpRound::kNearest);
+            RunRows<T, L, K>(Op(sf), a, aStep, b, bStep, d, dStep, roi, value);
+        } else {
+            RunRows<T, L, K>(Op(sf), a, aStep, b, bStep, d, dStep, roi, value);
+        }
     };
     if constexpr (std::is_floating_point_v<Element<T>>) {
         run.template operator()<Sf::kNone>();

@@ -5,6 +5,8 @@
 #include <climits>
 #include <cstring>
 
+#include <xmmintrin.h>
+
 #include "harness.h"
 #include "ref/arith_ref.h"
 
@@ -427,6 +429,54 @@ TEST(Mul, ZeroFromScaleFactor17For8u)
     EXPECT_EQ(d, 1);  // 65025 / 65536
     ASSERT_EQ(pvxiMul_8u_C1RSfs(&a, 1, &a, 1, &d, 1, {1, 1}, 17), pvxStsNoErr);
     EXPECT_EQ(d, 0);
+}
+
+// 16s products are scaled in float lanes at scale factors 1 to 8: ties, odd
+// and even, products around 2^24 (the end of exact floats) and the extremes
+// give the exact rule under each rounding mode a caller may have set, in the
+// plain, constant, in-place and square forms, and the caller's mode is back.
+TEST(Mul, Products16sIgnoreTheCallersRoundingMode)
+{
+    std::vector<Pvx16s> a, b;
+    for (int sf = 1; sf <= 8; ++sf)
+        for (int q : {0, 1, 2, 3, -1, -2, -3, 4095, -4096})
+            for (int off = -1; off <= 1; ++off) {  // ties and their neighbours: q * 2^sf + 2^(sf-1) + off
+                long p = static_cast<long>(q) * (1L << sf) + (1L << (sf - 1)) + off;
+                if (p % 2 != 0) continue;
+                a.push_back(2);
+                b.push_back(static_cast<Pvx16s>(p / 2));
+            }
+    for (Pvx16s x : {4096, 4097, 4095, -4096, -4097, 32767, -32768, 181, -181, 23170})
+        for (Pvx16s y : {4096, 4097, 4095, -4097, 32767, -32768, 2049, 23170}) {
+            a.push_back(x);
+            b.push_back(y);
+        }
+    const int n = static_cast<int>(a.size()), step = n * 2;
+    const unsigned saved = _MM_GET_ROUNDING_MODE();
+    for (unsigned mode : {_MM_ROUND_NEAREST, _MM_ROUND_DOWN, _MM_ROUND_UP, _MM_ROUND_TOWARD_ZERO})
+        for (int sf = 1; sf <= 9; ++sf) {
+            SCOPED_TRACE(::testing::Message() << "mode " << mode << " sf " << sf);
+            std::vector<Pvx16s> plain(n), inPlace = b, byConst(n), square(n);
+            _MM_SET_ROUNDING_MODE(mode);
+            PvxStatus s1 = pvxiMul_16s_C1RSfs(a.data(), step, b.data(), step, plain.data(), step, {n, 1}, sf);
+            PvxStatus s2 = pvxiMul_16s_C1IRSfs(a.data(), step, inPlace.data(), step, {n, 1}, sf);
+            PvxStatus s3 = pvxiMulC_16s_C1RSfs(b.data(), step, -3, byConst.data(), step, {n, 1}, sf);
+            PvxStatus s4 = pvxiSqr_16s_C1RSfs(b.data(), step, square.data(), step, {n, 1}, sf);
+            const unsigned after = _MM_GET_ROUNDING_MODE();
+            _MM_SET_ROUNDING_MODE(saved);
+            EXPECT_EQ(after, mode);
+            ASSERT_EQ(s1, pvxStsNoErr);
+            ASSERT_EQ(s2, pvxStsNoErr);
+            ASSERT_EQ(s3, pvxStsNoErr);
+            ASSERT_EQ(s4, pvxStsNoErr);
+            for (int i = 0; i < n; ++i) {
+                const pvxref::Wide x = a[i], y = b[i];
+                ASSERT_EQ(plain[i], pvxref::Sfs<Pvx16s>(x * y, sf)) << a[i] << " * " << b[i];
+                ASSERT_EQ(inPlace[i], plain[i]) << a[i] << " * " << b[i];
+                ASSERT_EQ(byConst[i], pvxref::Sfs<Pvx16s>(-3 * y, sf)) << b[i];
+                ASSERT_EQ(square[i], pvxref::Sfs<Pvx16s>(y * y, sf)) << b[i];
+            }
+        }
 }
 
 }  // namespace
