@@ -254,7 +254,7 @@ inline void Widen32(simd::VI v, simd::VI* out)
 //     above sf 8)
 //   template <class U> static VI Half(VI a, VI b): the whole sf == 1 result
 //   template <class U> static VI Down(VI a, VI b, const SfsK&): the whole
-//     result for sf 1 to 15 (32-bit lanes above)
+//     result for sf 1 to kDownMax<U> (32-bit lanes above)
 //   static VI L32(VI a, VI b) on 32-bit lanes, or
 //   template <class U> static void Exact32(VI a, VI b, VI* r) on raw registers
 //   template <class U> static VI Sat(VI a, VI b): the whole sf == 0 result
@@ -315,7 +315,7 @@ struct IntOp {
         } else if constexpr (M == Sf::kHalf) {
             return X::template Half<U>(a, b);
         } else if constexpr (M == Sf::kDown && HasDown<X, U>) {
-            return k.sf <= 15 ? X::template Down<U>(a, b, k) : Vec32(a, b);
+            return k.sf <= X::template kDownMax<U> ? X::template Down<U>(a, b, k) : Vec32(a, b);
         } else if constexpr (sizeof(U) == 1 && X::kFits16U) {
             if (M != Sf::kDown || k.sf <= 8) {
                 VI lo = Scale16U<M>(X::L16(WidenLoU8(a), WidenLoU8(b)), k);

@@ -479,4 +479,47 @@ TEST(Mul, Products16sIgnoreTheCallersRoundingMode)
         }
 }
 
+// 16u products go the same way at scale factors 1 to 8, the largest ones
+// (up to 65535 squared, which needs all 32 bits) saturating.
+TEST(Mul, Products16uIgnoreTheCallersRoundingMode)
+{
+    std::vector<Pvx16u> a, b;
+    for (int sf = 1; sf <= 8; ++sf)
+        for (int q : {0, 1, 2, 3, 4095, 65534, 65535})
+            for (int off = -1; off <= 1; ++off) {
+                long p = static_cast<long>(q) * (1L << sf) + (1L << (sf - 1)) + off;
+                if (p % 2 != 0 || p / 2 > 65535) continue;
+                a.push_back(2);
+                b.push_back(static_cast<Pvx16u>(p / 2));
+            }
+    for (Pvx16u x : {4096, 4097, 4095, 8191, 32768, 46341, 65535, 255, 256})
+        for (Pvx16u y : {4096, 4097, 4095, 2049, 65535, 32768, 46340, 257}) {
+            a.push_back(x);
+            b.push_back(y);
+        }
+    const int n = static_cast<int>(a.size()), step = n * 2;
+    const unsigned saved = _MM_GET_ROUNDING_MODE();
+    for (unsigned mode : {_MM_ROUND_NEAREST, _MM_ROUND_DOWN, _MM_ROUND_UP, _MM_ROUND_TOWARD_ZERO})
+        for (int sf = 1; sf <= 9; ++sf) {
+            SCOPED_TRACE(::testing::Message() << "mode " << mode << " sf " << sf);
+            std::vector<Pvx16u> plain(n), byConst(n), square(n);
+            _MM_SET_ROUNDING_MODE(mode);
+            PvxStatus s1 = pvxiMul_16u_C1RSfs(a.data(), step, b.data(), step, plain.data(), step, {n, 1}, sf);
+            PvxStatus s2 = pvxiMulC_16u_C1RSfs(b.data(), step, 65535, byConst.data(), step, {n, 1}, sf);
+            PvxStatus s3 = pvxiSqr_16u_C1RSfs(b.data(), step, square.data(), step, {n, 1}, sf);
+            const unsigned after = _MM_GET_ROUNDING_MODE();
+            _MM_SET_ROUNDING_MODE(saved);
+            EXPECT_EQ(after, mode);
+            ASSERT_EQ(s1, pvxStsNoErr);
+            ASSERT_EQ(s2, pvxStsNoErr);
+            ASSERT_EQ(s3, pvxStsNoErr);
+            for (int i = 0; i < n; ++i) {
+                const pvxref::Wide x = a[i], y = b[i];
+                ASSERT_EQ(plain[i], pvxref::Sfs<Pvx16u>(x * y, sf)) << a[i] << " * " << b[i];
+                ASSERT_EQ(byConst[i], pvxref::Sfs<Pvx16u>(65535 * y, sf)) << b[i];
+                ASSERT_EQ(square[i], pvxref::Sfs<Pvx16u>(y * y, sf)) << b[i];
+            }
+        }
+}
+
 }  // namespace
