@@ -431,95 +431,82 @@ TEST(Mul, ZeroFromScaleFactor17For8u)
     EXPECT_EQ(d, 0);
 }
 
-// 16s products are scaled in float lanes at scale factors 1 to 8: ties, odd
-// and even, products around 2^24 (the end of exact floats) and the extremes
-// give the exact rule under each rounding mode a caller may have set, in the
-// plain, constant, in-place and square forms, and the caller's mode is back.
-TEST(Mul, Products16sIgnoreTheCallersRoundingMode)
+// The product members of one 16-bit type, for the rounding-mode test.
+template <class T>
+struct Products {
+    PvxStatus (*mul)(const T*, int, const T*, int, T*, int, PvxiSize, int);
+    PvxStatus (*mulI)(const T*, int, T*, int, PvxiSize, int);
+    PvxStatus (*mulC)(const T*, int, T, T*, int, PvxiSize, int);
+    PvxStatus (*sqr)(const T*, int, T*, int, PvxiSize, int);
+    T constant;
+};
+
+// Operands a * b: for each scale factor 1 to 8, products at the ties
+// q 2^sf + 2^(sf-1) (odd and even q) and one off them either side, and
+// then every pair of the given values.
+template <class T>
+void TieOperands(std::initializer_list<int> qs, std::initializer_list<T> values, std::vector<T>& a, std::vector<T>& b)
 {
-    std::vector<Pvx16s> a, b;
     for (int sf = 1; sf <= 8; ++sf)
-        for (int q : {0, 1, 2, 3, -1, -2, -3, 4095, -4096})
-            for (int off = -1; off <= 1; ++off) {  // ties and their neighbours: q * 2^sf + 2^(sf-1) + off
+        for (int q : qs)
+            for (int off = -1; off <= 1; ++off) {
                 long p = static_cast<long>(q) * (1L << sf) + (1L << (sf - 1)) + off;
-                if (p % 2 != 0) continue;
+                if (p % 2 != 0 || p / 2 > std::numeric_limits<T>::max()) continue;
                 a.push_back(2);
-                b.push_back(static_cast<Pvx16s>(p / 2));
+                b.push_back(static_cast<T>(p / 2));
             }
-    for (Pvx16s x : {4096, 4097, 4095, -4096, -4097, 32767, -32768, 181, -181, 23170})
-        for (Pvx16s y : {4096, 4097, 4095, -4097, 32767, -32768, 2049, 23170}) {
+    for (T x : values)
+        for (T y : values) {
             a.push_back(x);
             b.push_back(y);
         }
-    const int n = static_cast<int>(a.size()), step = n * 2;
+}
+
+// 16-bit products are scaled in float lanes at scale factors 1 to 8: they
+// give the exact rule under each rounding mode a caller may have set, in the
+// plain, in-place, constant and square forms, and the caller's mode is back.
+template <class T>
+void ProductsIgnoreTheCallersRoundingMode(const Products<T>& f, const std::vector<T>& a, const std::vector<T>& b)
+{
+    const int n = static_cast<int>(a.size()), step = n * static_cast<int>(sizeof(T));
     const unsigned saved = _MM_GET_ROUNDING_MODE();
     for (unsigned mode : {_MM_ROUND_NEAREST, _MM_ROUND_DOWN, _MM_ROUND_UP, _MM_ROUND_TOWARD_ZERO})
         for (int sf = 1; sf <= 9; ++sf) {
             SCOPED_TRACE(::testing::Message() << "mode " << mode << " sf " << sf);
-            std::vector<Pvx16s> plain(n), inPlace = b, byConst(n), square(n);
+            std::vector<T> plain(n), inPlace = b, byConst(n), square(n);
             _MM_SET_ROUNDING_MODE(mode);
-            PvxStatus s1 = pvxiMul_16s_C1RSfs(a.data(), step, b.data(), step, plain.data(), step, {n, 1}, sf);
-            PvxStatus s2 = pvxiMul_16s_C1IRSfs(a.data(), step, inPlace.data(), step, {n, 1}, sf);
-            PvxStatus s3 = pvxiMulC_16s_C1RSfs(b.data(), step, -3, byConst.data(), step, {n, 1}, sf);
-            PvxStatus s4 = pvxiSqr_16s_C1RSfs(b.data(), step, square.data(), step, {n, 1}, sf);
+            const PvxStatus st[4] = {f.mul(a.data(), step, b.data(), step, plain.data(), step, {n, 1}, sf),
+                                     f.mulI(a.data(), step, inPlace.data(), step, {n, 1}, sf),
+                                     f.mulC(b.data(), step, f.constant, byConst.data(), step, {n, 1}, sf),
+                                     f.sqr(b.data(), step, square.data(), step, {n, 1}, sf)};
             const unsigned after = _MM_GET_ROUNDING_MODE();
             _MM_SET_ROUNDING_MODE(saved);
             EXPECT_EQ(after, mode);
-            ASSERT_EQ(s1, pvxStsNoErr);
-            ASSERT_EQ(s2, pvxStsNoErr);
-            ASSERT_EQ(s3, pvxStsNoErr);
-            ASSERT_EQ(s4, pvxStsNoErr);
+            for (PvxStatus s : st) ASSERT_EQ(s, pvxStsNoErr);
             for (int i = 0; i < n; ++i) {
                 const pvxref::Wide x = a[i], y = b[i];
-                ASSERT_EQ(plain[i], pvxref::Sfs<Pvx16s>(x * y, sf)) << a[i] << " * " << b[i];
+                ASSERT_EQ(plain[i], pvxref::Sfs<T>(x * y, sf)) << a[i] << " * " << b[i];
                 ASSERT_EQ(inPlace[i], plain[i]) << a[i] << " * " << b[i];
-                ASSERT_EQ(byConst[i], pvxref::Sfs<Pvx16s>(-3 * y, sf)) << b[i];
-                ASSERT_EQ(square[i], pvxref::Sfs<Pvx16s>(y * y, sf)) << b[i];
+                ASSERT_EQ(byConst[i], pvxref::Sfs<T>(f.constant * y, sf)) << b[i];
+                ASSERT_EQ(square[i], pvxref::Sfs<T>(y * y, sf)) << b[i];
             }
         }
 }
 
-// 16u products go the same way at scale factors 1 to 8, the largest ones
-// (up to 65535 squared, which needs all 32 bits) saturating.
-TEST(Mul, Products16uIgnoreTheCallersRoundingMode)
+// Products around 2^24 (the end of exact floats) and the extremes too; 16u
+// products up to 65535 squared need all 32 bits and saturate.
+TEST(Mul, Products16IgnoreTheCallersRoundingMode)
 {
-    std::vector<Pvx16u> a, b;
-    for (int sf = 1; sf <= 8; ++sf)
-        for (int q : {0, 1, 2, 3, 4095, 65534, 65535})
-            for (int off = -1; off <= 1; ++off) {
-                long p = static_cast<long>(q) * (1L << sf) + (1L << (sf - 1)) + off;
-                if (p % 2 != 0 || p / 2 > 65535) continue;
-                a.push_back(2);
-                b.push_back(static_cast<Pvx16u>(p / 2));
-            }
-    for (Pvx16u x : {4096, 4097, 4095, 8191, 32768, 46341, 65535, 255, 256})
-        for (Pvx16u y : {4096, 4097, 4095, 2049, 65535, 32768, 46340, 257}) {
-            a.push_back(x);
-            b.push_back(y);
-        }
-    const int n = static_cast<int>(a.size()), step = n * 2;
-    const unsigned saved = _MM_GET_ROUNDING_MODE();
-    for (unsigned mode : {_MM_ROUND_NEAREST, _MM_ROUND_DOWN, _MM_ROUND_UP, _MM_ROUND_TOWARD_ZERO})
-        for (int sf = 1; sf <= 9; ++sf) {
-            SCOPED_TRACE(::testing::Message() << "mode " << mode << " sf " << sf);
-            std::vector<Pvx16u> plain(n), byConst(n), square(n);
-            _MM_SET_ROUNDING_MODE(mode);
-            PvxStatus s1 = pvxiMul_16u_C1RSfs(a.data(), step, b.data(), step, plain.data(), step, {n, 1}, sf);
-            PvxStatus s2 = pvxiMulC_16u_C1RSfs(b.data(), step, 65535, byConst.data(), step, {n, 1}, sf);
-            PvxStatus s3 = pvxiSqr_16u_C1RSfs(b.data(), step, square.data(), step, {n, 1}, sf);
-            const unsigned after = _MM_GET_ROUNDING_MODE();
-            _MM_SET_ROUNDING_MODE(saved);
-            EXPECT_EQ(after, mode);
-            ASSERT_EQ(s1, pvxStsNoErr);
-            ASSERT_EQ(s2, pvxStsNoErr);
-            ASSERT_EQ(s3, pvxStsNoErr);
-            for (int i = 0; i < n; ++i) {
-                const pvxref::Wide x = a[i], y = b[i];
-                ASSERT_EQ(plain[i], pvxref::Sfs<Pvx16u>(x * y, sf)) << a[i] << " * " << b[i];
-                ASSERT_EQ(byConst[i], pvxref::Sfs<Pvx16u>(65535 * y, sf)) << b[i];
-                ASSERT_EQ(square[i], pvxref::Sfs<Pvx16u>(y * y, sf)) << b[i];
-            }
-        }
+    std::vector<Pvx16s> a, b;
+    TieOperands<Pvx16s>({0, 1, 2, 3, -1, -2, -3, 4095, -4096},
+                        {4096, 4097, 4095, -4096, -4097, 32767, -32768, 181, -181, 23170, 2049}, a, b);
+    ProductsIgnoreTheCallersRoundingMode<Pvx16s>(
+        {pvxiMul_16s_C1RSfs, pvxiMul_16s_C1IRSfs, pvxiMulC_16s_C1RSfs, pvxiSqr_16s_C1RSfs, -3}, a, b);
+    std::vector<Pvx16u> c, d;
+    TieOperands<Pvx16u>({0, 1, 2, 3, 4095, 65534, 65535},
+                        {4096, 4097, 4095, 8191, 32768, 46340, 46341, 65535, 255, 256, 257, 2049}, c, d);
+    ProductsIgnoreTheCallersRoundingMode<Pvx16u>(
+        {pvxiMul_16u_C1RSfs, pvxiMul_16u_C1IRSfs, pvxiMulC_16u_C1RSfs, pvxiSqr_16u_C1RSfs, 65535}, c, d);
 }
 
 }  // namespace

@@ -136,73 +136,60 @@ TEST(MoveStreaming, MirrorInPlaceLargeRegions)
     MirrorInPlaceLarge(pvxiMirror_16u_AC4IR, true, 199, 343, 18);
 }
 
-// Planes merged into pixels stream once what the call reads and writes
-// reaches the cache; the planes are stacked in one image, so they share its
-// step and the padding between its rows.
+// Planes merged into pixels, and pixels split into planes, stream once what
+// the call reads and writes reaches the cache; the planes are stacked in one
+// image, so they share its step and the padding between its rows (and,
+// unaligned, start at different offsets within a vector).
 template <class T>
-void MergeLarge(PvxStatus (*fn)(const T* const*, int, T*, int, PvxiSize), int ch, int w, int h, std::uint64_t seed)
+using MergeFn = PvxStatus (*)(const T* const*, int, T*, int, PvxiSize);
+template <class T>
+using SplitFn = PvxStatus (*)(const T*, int, T* const*, int, PvxiSize);
+
+template <class T, class Fn>
+void PlanarLarge(Fn fn, int ch, int w, int h, std::uint64_t seed)
 {
+    constexpr bool kSplit = std::is_same_v<Fn, SplitFn<T>>;
     Rng rng = MakeRng(seed);
     for (bool aligned : {true, false}) {
-        SCOPED_TRACE(::testing::Message() << "Merge " << sizeof(T) << "-byte P" << ch << " " << w << "x" << h
-                                          << " aligned " << aligned);
+        SCOPED_TRACE(::testing::Message() << (kSplit ? "Split " : "Merge ") << sizeof(T) << "-byte " << ch << " "
+                                          << w << "x" << h << " aligned " << aligned);
         ShapeOptions o{!aligned, !aligned, false, 0};
-        GuardedImage planes = MakeImage<T>(w, h * ch, 1, rng, o), dst = MakeImage<T>(w, h, ch, rng, o);
-        GuardedImage want = dst;
-        const T* p[4] = {};
-        for (int c = 0; c < ch; ++c) p[c] = planes.row<T>(c * h);
-        SmallCache cache(kCache);
-        ASSERT_EQ(fn(p, planes.step(), dst.ptr<T>(), dst.step(), {w, h}), pvxStsNoErr);
-        EXPECT_GT(gCacheQueries.load(), 0);
-        for (int y = 0; y < h; ++y)
-            for (int x = 0; x < w; ++x)
-                for (int c = 0; c < ch; ++c) want.row<T>(y)[x * ch + c] = planes.row<T>(c * h + y)[x];
-        EXPECT_TRUE(RegionEquals(dst, want.Packed<T>()));
-    }
-}
-
-TEST(MoveStreaming, MergeLargeRegions)
-{
-    // Above the thresholds: 393217 bytes written for 1- and 2-byte
-    // elements (read and written above 786433), 786433 written for 32f.
-    MergeLarge(pvxiCopy_8u_P3C3R, 3, 401, 337, 21);
-    MergeLarge(pvxiCopy_8u_P4C4R, 4, 331, 301, 22);
-    MergeLarge(pvxiCopy_16s_P3C3R, 3, 261, 257, 23);
-    MergeLarge(pvxiCopy_16u_P4C4R, 4, 211, 237, 24);
-    MergeLarge(pvxiCopy_32f_P3C3R, 3, 271, 251, 25);
-}
-
-// Pixels split into planes stream under the same rule; the planes share
-// one step and, unaligned, start at different offsets within a vector.
-template <class T>
-void SplitLarge(PvxStatus (*fn)(const T*, int, T* const*, int, PvxiSize), int ch, int w, int h, std::uint64_t seed)
-{
-    Rng rng = MakeRng(seed);
-    for (bool aligned : {true, false}) {
-        SCOPED_TRACE(::testing::Message() << "Split " << sizeof(T) << "-byte C" << ch << " " << w << "x" << h
-                                          << " aligned " << aligned);
-        ShapeOptions o{!aligned, !aligned, false, 0};
-        GuardedImage src = MakeImage<T>(w, h, ch, rng, o), planes = MakeImage<T>(w, h * ch, 1, rng, o);
-        GuardedImage want = planes;
+        GuardedImage planes = MakeImage<T>(w, h * ch, 1, rng, o), pixels = MakeImage<T>(w, h, ch, rng, o);
+        GuardedImage want = kSplit ? planes : pixels;
         T* p[4] = {};
         for (int c = 0; c < ch; ++c) p[c] = planes.row<T>(c * h);
         SmallCache cache(kCache);
-        ASSERT_EQ(fn(src.ptr<T>(), src.step(), p, planes.step(), {w, h}), pvxStsNoErr);
+        if constexpr (kSplit) {
+            ASSERT_EQ(fn(pixels.ptr<T>(), pixels.step(), p, planes.step(), {w, h}), pvxStsNoErr);
+        } else {
+            const T* const* in = p;
+            ASSERT_EQ(fn(in, planes.step(), pixels.ptr<T>(), pixels.step(), {w, h}), pvxStsNoErr);
+        }
         EXPECT_GT(gCacheQueries.load(), 0);
         for (int y = 0; y < h; ++y)
             for (int x = 0; x < w; ++x)
-                for (int c = 0; c < ch; ++c) want.row<T>(c * h + y)[x] = src.row<T>(y)[x * ch + c];
-        EXPECT_TRUE(RegionEquals(planes, want.Packed<T>()));
+                for (int c = 0; c < ch; ++c) {
+                    if constexpr (kSplit) want.row<T>(c * h + y)[x] = pixels.row<T>(y)[x * ch + c];
+                    else want.row<T>(y)[x * ch + c] = planes.row<T>(c * h + y)[x];
+                }
+        EXPECT_TRUE(RegionEquals(kSplit ? planes : pixels, want.Packed<T>()));
     }
 }
 
-TEST(MoveStreaming, SplitLargeRegions)
+TEST(MoveStreaming, PlanarLargeRegions)
 {
-    SplitLarge(pvxiCopy_8u_C3P3R, 3, 403, 331, 31);
-    SplitLarge(pvxiCopy_8u_C4P4R, 4, 333, 299, 32);
-    SplitLarge(pvxiCopy_16s_C3P3R, 3, 263, 255, 33);
-    SplitLarge(pvxiCopy_16u_C4P4R, 4, 213, 235, 34);
-    SplitLarge(pvxiCopy_32f_C4P4R, 4, 271, 251, 35);
+    // Above the thresholds: 393217 bytes written for 1- and 2-byte
+    // elements (read and written above 786433), 786433 written for 32f.
+    PlanarLarge<Pvx8u, MergeFn<Pvx8u>>(pvxiCopy_8u_P3C3R, 3, 401, 337, 21);
+    PlanarLarge<Pvx8u, MergeFn<Pvx8u>>(pvxiCopy_8u_P4C4R, 4, 331, 301, 22);
+    PlanarLarge<Pvx16s, MergeFn<Pvx16s>>(pvxiCopy_16s_P3C3R, 3, 261, 257, 23);
+    PlanarLarge<Pvx16u, MergeFn<Pvx16u>>(pvxiCopy_16u_P4C4R, 4, 211, 237, 24);
+    PlanarLarge<Pvx32f, MergeFn<Pvx32f>>(pvxiCopy_32f_P3C3R, 3, 271, 251, 25);
+    PlanarLarge<Pvx8u, SplitFn<Pvx8u>>(pvxiCopy_8u_C3P3R, 3, 403, 331, 31);
+    PlanarLarge<Pvx8u, SplitFn<Pvx8u>>(pvxiCopy_8u_C4P4R, 4, 333, 299, 32);
+    PlanarLarge<Pvx16s, SplitFn<Pvx16s>>(pvxiCopy_16s_C3P3R, 3, 263, 255, 33);
+    PlanarLarge<Pvx16u, SplitFn<Pvx16u>>(pvxiCopy_16u_C4P4R, 4, 213, 235, 34);
+    PlanarLarge<Pvx32f, SplitFn<Pvx32f>>(pvxiCopy_32f_C4P4R, 4, 271, 251, 35);
 }
 
 // Dup streams like the merges (above 786433 bytes read and written); C1C4
