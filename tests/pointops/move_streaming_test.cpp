@@ -82,9 +82,10 @@ template <class T>
 void MirrorLarge(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int), bool alpha, int w, int h, std::uint64_t seed)
 {
     Rng rng = MakeRng(seed);
-    // The larger cache keeps ordinary stores but still fetches the falling
-    // rows of flip 0 ahead.
-    for (int cacheBytes : {kCache, 4 * kCache})
+    // The larger cache keeps ordinary stores (the region read and written
+    // is under half of it) but still fetches the falling rows of flip 0
+    // ahead (it is over a quarter).
+    for (int cacheBytes : {kCache, 10 * kCache})
         for (int flip = 0; flip < 3; ++flip)
             for (bool aligned : {true, false}) {
                 SCOPED_TRACE(::testing::Message() << "Mirror " << sizeof(T) << "-byte " << (alpha ? "AC4" : "C4") << " "
