@@ -78,37 +78,45 @@ TEST(MoveStreaming, TransposeLargeRegions)
     TransposeLarge(pvxiTranspose_32f_C4R, 4, 133, 141, 8);
 }
 
+// Regions of 393 to 750 kB: streamed under the smaller cache; under the
+// larger one (the region read and written under half of it, over a quarter)
+// ordinary stores, with the falling rows of flip 0 fetched ahead where alpha
+// is kept.
 template <class T>
-void MirrorLarge(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int), bool alpha, int w, int h, std::uint64_t seed)
+void MirrorLarge(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int), int ch, bool alpha, int w, int h,
+                 std::uint64_t seed)
 {
     Rng rng = MakeRng(seed);
-    // The larger cache keeps ordinary stores (the region read and written
-    // is under half of it) but still fetches the falling rows of flip 0
-    // ahead (it is over a quarter).
     for (int cacheBytes : {kCache, 10 * kCache})
         for (int flip = 0; flip < 3; ++flip)
             for (bool aligned : {true, false}) {
-                SCOPED_TRACE(::testing::Message() << "Mirror " << sizeof(T) << "-byte " << (alpha ? "AC4" : "C4") << " "
-                                                  << w << "x" << h << " flip " << flip << " aligned " << aligned
-                                                  << " cache " << cacheBytes);
+                SCOPED_TRACE(::testing::Message() << "Mirror " << sizeof(T) << "-byte " << (alpha ? "AC" : "C") << ch
+                                                  << " " << w << "x" << h << " flip " << flip << " aligned "
+                                                  << aligned << " cache " << cacheBytes);
                 ShapeOptions o{!aligned, !aligned, false, 0};
-                GuardedImage src = MakeImage<T>(w, h, 4, rng, o), dst = MakeImage<T>(w, h, 4, rng, o);
+                GuardedImage src = MakeImage<T>(w, h, ch, rng, o), dst = MakeImage<T>(w, h, ch, rng, o);
                 const auto dstBefore = dst.Packed<T>();  // AC4 keeps its alpha
                 SmallCache cache(cacheBytes);
                 ASSERT_EQ(fn(src.ptr<T>(), src.step(), dst.ptr<T>(), dst.step(), {w, h}, flip), pvxStsNoErr);
                 EXPECT_GT(gCacheQueries.load(), 0);
-                EXPECT_TRUE(RegionEquals(dst, RefMirror(src.Packed<T>(), dstBefore, w, h, 4, alpha, flip)));
+                EXPECT_TRUE(RegionEquals(dst, RefMirror(src.Packed<T>(), dstBefore, w, h, ch, alpha, flip)));
             }
 }
 
-TEST(MoveStreaming, MirrorLargeFourChannelRegions)
+TEST(MoveStreaming, MirrorLargeRegions)
 {
-    MirrorLarge(pvxiMirror_8u_C4R, false, 400, 333, 11);
-    MirrorLarge(pvxiMirror_8u_AC4R, true, 397, 345, 12);
-    MirrorLarge(pvxiMirror_16s_C4R, false, 260, 257, 13);
-    MirrorLarge(pvxiMirror_16u_AC4R, true, 263, 255, 14);
-    MirrorLarge(pvxiMirror_32f_C4R, false, 190, 181, 15);
-    MirrorLarge(pvxiMirror_32s_AC4R, true, 181, 190, 16);
+    MirrorLarge(pvxiMirror_8u_C4R, 4, false, 400, 333, 11);
+    MirrorLarge(pvxiMirror_8u_AC4R, 4, true, 397, 345, 12);
+    MirrorLarge(pvxiMirror_16s_C4R, 4, false, 260, 257, 13);
+    MirrorLarge(pvxiMirror_16u_AC4R, 4, true, 263, 255, 14);
+    MirrorLarge(pvxiMirror_32f_C4R, 4, false, 190, 181, 15);
+    MirrorLarge(pvxiMirror_32s_AC4R, 4, true, 181, 190, 16);
+    MirrorLarge(pvxiMirror_8u_C1R, 1, false, 701, 601, 41);
+    MirrorLarge(pvxiMirror_16u_C1R, 1, false, 501, 433, 42);
+    MirrorLarge(pvxiMirror_32f_C1R, 1, false, 331, 311, 43);
+    MirrorLarge(pvxiMirror_8u_C3R, 3, false, 401, 347, 44);
+    MirrorLarge(pvxiMirror_16s_C3R, 3, false, 281, 253, 45);
+    MirrorLarge(pvxiMirror_32s_C3R, 3, false, 203, 199, 46);
 }
 
 // In place, flip 0 fetches its falling rows ahead on large regions too (and
