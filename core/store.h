@@ -12,7 +12,6 @@ namespace pvx {
 
 // Thresholds in bytes written, by family.
 inline constexpr std::int64_t kNtThresholdSet = 1048576;
-inline constexpr std::int64_t kNtThresholdSmall = 262144;
 inline constexpr std::int64_t kNtThresholdMedium = 524289;
 inline constexpr std::int64_t kNtThresholdLarge = 786433;
 

@@ -11,9 +11,11 @@
 // registers (16 x 16 and 8 x 8 bytes, 8 x 8 and 4 x 4 16-bit, 4 x 4 32-bit,
 // 2 x 2 64-bit, and 4 x 4 and 2 x 2 of the three-channel pixels; 12-byte
 // pixels move one at a time with single 16-byte stores), walked in
-// cache-sized tiles. Regions of more than 256 kB that are at least as large
-// as the largest cache are written through a tile buffer with non-temporal
-// stores.
+// cache-sized tiles. Regions are written through a tile buffer with
+// non-temporal stores as arithmetic streams, once what the call reads and
+// writes reaches half the largest cache (1080p 32f C3 and 4K 8u C3 frames:
+// 1.4 times faster than ordinary stores, which had taken over just below the
+// cache size).
 #include <algorithm>
 #include <cstring>
 
@@ -326,7 +328,7 @@ PvxStatus TransposeBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSi
     constexpr int PS = sizeof(T) * kChannels<L>;
     const Bytes* s = reinterpret_cast<const Bytes*>(pSrc);
     Bytes* d = reinterpret_cast<Bytes*>(pDst);
-    if (UseNonTemporal(std::int64_t{roi.width} * roi.height * PS, kNtThresholdSmall))
+    if (StreamWorkingSet(2 * std::int64_t{roi.width} * roi.height * PS))
         TransposeStreaming<PS>(s, srcStep, d, dstStep, roi.width, roi.height);
     else
         TransposeTiled<PS>(s, srcStep, d, dstStep, roi.width, roi.height);
