@@ -188,8 +188,8 @@ void PlanarLarge(Fn fn, int ch, int w, int h, std::uint64_t seed)
 
 TEST(MoveStreaming, PlanarLargeRegions)
 {
-    // Above the thresholds: 393217 bytes written for 1- and 2-byte
-    // elements (read and written above 786433), 786433 written for 32f.
+    // Above the threshold: more than 393216 bytes written (read and written
+    // above 786433).
     PlanarLarge<Pvx8u, MergeFn<Pvx8u>>(pvxiCopy_8u_P3C3R, 3, 401, 337, 21);
     PlanarLarge<Pvx8u, MergeFn<Pvx8u>>(pvxiCopy_8u_P4C4R, 4, 331, 301, 22);
     PlanarLarge<Pvx16s, MergeFn<Pvx16s>>(pvxiCopy_16s_P3C3R, 3, 261, 257, 23);
