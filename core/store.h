@@ -1,7 +1,7 @@
-// The cache-aware store choice of the large-region writers: regions above a
-// family's threshold that are at least as large as the largest cache are
-// written with non-temporal stores so that they do not evict the caller's
-// working set. The pixels written are the same either way.
+// The cache-aware store choice of the large-region writers: non-temporal
+// stores where the written pixels would be pushed out of the cache before
+// anyone reads them, which saves the read of every written line and spares
+// the caller's working set. The pixels written are the same either way.
 #pragma once
 
 #include <cstdint>
@@ -10,11 +10,12 @@
 
 namespace pvx {
 
-// Thresholds in bytes written, by family.
+// Thresholds in bytes: fills written, and calls read and written.
 inline constexpr std::int64_t kNtThresholdSet = 1048576;
-inline constexpr std::int64_t kNtThresholdMedium = 524289;
 inline constexpr std::int64_t kNtThresholdLarge = 786433;
 
+// The choice of fills, which read nothing: streamed above the threshold
+// once they write at least the largest cache.
 inline bool UseNonTemporal(std::int64_t bytesWritten, std::int64_t threshold)
 {
     if (bytesWritten <= threshold) return false;
@@ -23,10 +24,10 @@ inline bool UseNonTemporal(std::int64_t bytesWritten, std::int64_t threshold)
     return bytesWritten >= cache;
 }
 
-// The streamed-store choice of calls that read as much as they write
-// (arithmetic, planes merged into pixels, channel swaps): streamed once the
-// bytes read and written reach half the largest cache and exceed the
-// large-region threshold.
+// The choice of calls that read as much as they write (arithmetic, planes
+// and pixels, channel swaps, mirrors, transposes): streamed once the bytes
+// read and written reach half the largest cache and exceed the large-region
+// threshold.
 inline bool StreamWorkingSet(std::int64_t bytesTouched)
 {
     if (bytesTouched <= kNtThresholdLarge) return false;

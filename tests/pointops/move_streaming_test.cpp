@@ -79,10 +79,10 @@ TEST(MoveStreaming, TransposeLargeRegions)
     TransposeLarge(pvxiTranspose_32f_C4R, 4, 163, 157, 8);
 }
 
-// Regions of 393 to 750 kB: streamed under the smaller cache; under the
-// larger one (the region read and written under half of it, over a quarter)
-// ordinary stores, with the falling rows of flip 0 fetched ahead where alpha
-// is kept.
+// Regions of 393 to 750 kB: streamed under the smaller cache, except AC4,
+// which never streams; under the larger one (the region read and written
+// under half of it, over a quarter) ordinary stores, with the falling rows
+// of flip 0 fetched ahead where alpha is kept.
 template <class T>
 void MirrorLarge(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int), int ch, bool alpha, int w, int h,
                  std::uint64_t seed)
@@ -99,7 +99,9 @@ void MirrorLarge(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize, int), int ch,
                 const auto dstBefore = dst.Packed<T>();  // AC4 keeps its alpha
                 SmallCache cache(cacheBytes);
                 ASSERT_EQ(fn(src.ptr<T>(), src.step(), dst.ptr<T>(), dst.step(), {w, h}, flip), pvxStsNoErr);
-                EXPECT_GT(gCacheQueries.load(), 0);
+                if (!alpha || flip == 0) {
+                    EXPECT_GT(gCacheQueries.load(), 0);
+                }
                 EXPECT_TRUE(RegionEquals(dst, RefMirror(src.Packed<T>(), dstBefore, w, h, ch, alpha, flip)));
             }
 }
