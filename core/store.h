@@ -36,6 +36,20 @@ inline bool StreamWorkingSet(std::int64_t bytesTouched)
     return bytesTouched >= cache / 2;
 }
 
+// The choice of fetching the sources of row loops ahead in software: worth
+// its load slots once the bytes read and written are beyond the core's own
+// caches (above 1 MB) but within half the largest cache; beyond that they
+// come from memory, and the fetches got in the way of the hardware's.
+inline constexpr std::int64_t kFetchSourcesMin = 1048576;
+
+inline bool FetchSources(std::int64_t bytesTouched)
+{
+    if (bytesTouched <= kFetchSourcesMin) return false;
+    int cache = 0;
+    if (pvxGetMaxCacheSizeB(&cache) != pvxStsNoErr) return false;
+    return bytesTouched < cache / 2;
+}
+
 // The choice of fetching in software the streams that the hardware
 // prefetchers do not follow (rows taken in falling order): worth its load
 // slots once the working set is unlikely to be in the cache, taken as a

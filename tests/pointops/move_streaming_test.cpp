@@ -230,8 +230,10 @@ TEST(MoveStreaming, DupLargeRegions)
     DupLarge(pvxiDup_8u_C1C4R, 4, 401, 397, 27);
 }
 
-// Arithmetic streams its stores once a call reads and writes half the cache;
-// the pixels and the status must be those of the ordinary stores.
+// Arithmetic streams its stores once a call reads and writes half the cache,
+// and below that, from 1 MB, fetches its sources ahead (aligned rows only);
+// the pixels and the status must be those of the same rows done one call
+// each, too small for either.
 template <class Call>
 void ArithLarge(const char* name, int elemBytes, int ch, int w, int h, std::uint64_t seed, Call call)
 {
@@ -251,33 +253,51 @@ void ArithLarge(const char* name, int elemBytes, int ch, int w, int h, std::uint
                 }
             for (int y = 0; y < h; ++y) a.row<Pvx32f>(y)[(y * 7) % (w * ch)] = 0;
         }
-        GuardedImage plain(w, h, ch * elemBytes, elemBytes, rng, o);
-        GuardedImage streamed = plain;
-        PvxStatus want = call(a, b, plain);
-        SmallCache cache(kCache);
-        EXPECT_EQ(call(a, b, streamed), want);
-        EXPECT_GT(gCacheQueries.load(), 0);
-        EXPECT_TRUE(RegionEquals(streamed, plain.Packed<Pvx8u>()));
+        GuardedImage byRow(w, h, ch * elemBytes, elemBytes, rng, o);
+        GuardedImage fetched = byRow, streamed = byRow;
+        PvxStatus want = pvxStsNoErr;
+        for (int y = 0; y < h; ++y)
+            if (PvxStatus s = call(a, b, byRow, y, 1); s != pvxStsNoErr && want == pvxStsNoErr) want = s;
+        {
+            SmallCache cache(1 << 30);
+            EXPECT_EQ(call(a, b, fetched, 0, h), want);
+            EXPECT_GT(gCacheQueries.load(), 0);
+        }
+        {
+            SmallCache cache(kCache);
+            EXPECT_EQ(call(a, b, streamed, 0, h), want);
+            EXPECT_GT(gCacheQueries.load(), 0);
+        }
+        EXPECT_TRUE(RegionEquals(fetched, byRow.Packed<Pvx8u>()));
+        EXPECT_TRUE(RegionEquals(streamed, byRow.Packed<Pvx8u>()));
     }
 }
 
 TEST(MoveStreaming, ArithmeticLargeRegions)
 {
-    // 3 x 297 x 301 x 4 bytes: above 786433 read and written.
-    ArithLarge("Add_32f_C1R", 4, 1, 297, 301, 31, [](GuardedImage& a, GuardedImage& b, GuardedImage& d) {
-        return pvxiAdd_32f_C1R(a.ptr<Pvx32f>(), a.step(), b.ptr<Pvx32f>(), b.step(), d.ptr<Pvx32f>(), d.step(),
-                               {297, 301});
+    // Above 1 MB read and written.
+    using G = GuardedImage;
+    ArithLarge("Add_32f_C1R", 4, 1, 297, 301, 31, [](G& a, G& b, G& d, int y, int n) {
+        return pvxiAdd_32f_C1R(a.row<Pvx32f>(y), a.step(), b.row<Pvx32f>(y), b.step(), d.row<Pvx32f>(y), d.step(),
+                               {297, n});
     });
-    ArithLarge("Div_32f_C3R", 4, 3, 172, 203, 32, [](GuardedImage& a, GuardedImage& b, GuardedImage& d) {
-        return pvxiDiv_32f_C3R(a.ptr<Pvx32f>(), a.step(), b.ptr<Pvx32f>(), b.step(), d.ptr<Pvx32f>(), d.step(),
-                               {172, 203});
+    ArithLarge("Div_32f_C3R", 4, 3, 172, 203, 32, [](G& a, G& b, G& d, int y, int n) {
+        return pvxiDiv_32f_C3R(a.row<Pvx32f>(y), a.step(), b.row<Pvx32f>(y), b.step(), d.row<Pvx32f>(y), d.step(),
+                               {172, n});
     });
-    ArithLarge("Sub_16s_C3RSfs", 2, 3, 251, 199, 33, [](GuardedImage& a, GuardedImage& b, GuardedImage& d) {
-        return pvxiSub_16s_C3RSfs(a.ptr<Pvx16s>(), a.step(), b.ptr<Pvx16s>(), b.step(), d.ptr<Pvx16s>(), d.step(),
-                                  {251, 199}, 1);
+    ArithLarge("Sub_16s_C3RSfs", 2, 3, 251, 239, 33, [](G& a, G& b, G& d, int y, int n) {
+        return pvxiSub_16s_C3RSfs(a.row<Pvx16s>(y), a.step(), b.row<Pvx16s>(y), b.step(), d.row<Pvx16s>(y),
+                                  d.step(), {251, n}, 1);
     });
-    ArithLarge("MulC_8u_C1RSfs", 1, 1, 701, 613, 34, [](GuardedImage& a, GuardedImage&, GuardedImage& d) {
-        return pvxiMulC_8u_C1RSfs(a.ptr<Pvx8u>(), a.step(), 3, d.ptr<Pvx8u>(), d.step(), {701, 613}, 2);
+    ArithLarge("Add_8u_C3RSfs", 1, 3, 397, 311, 35, [](G& a, G& b, G& d, int y, int n) {
+        return pvxiAdd_8u_C3RSfs(a.row<Pvx8u>(y), a.step(), b.row<Pvx8u>(y), b.step(), d.row<Pvx8u>(y), d.step(),
+                                 {397, n}, 1);
+    });
+    ArithLarge("MulC_8u_C1RSfs", 1, 1, 701, 763, 34, [](G& a, G&, G& d, int y, int n) {
+        return pvxiMulC_8u_C1RSfs(a.row<Pvx8u>(y), a.step(), 3, d.row<Pvx8u>(y), d.step(), {701, n}, 2);
+    });
+    ArithLarge("Abs_16s_C1R", 2, 1, 613, 457, 36, [](G& a, G&, G& d, int y, int n) {
+        return pvxiAbs_16s_C1R(a.row<Pvx16s>(y), a.step(), d.row<Pvx16s>(y), d.step(), {613, n});
     });
 }
 
