@@ -476,15 +476,6 @@ struct Pattern {
 // to 736 us, and 4.5 to 4.2 us on 64 KB rows in L2).
 inline constexpr int kPrefetchAhead = 1024;
 
-// Rows whose working set is beyond the core's own caches but within the
-// shared one (FetchSources) have their sources fetched this far ahead: the
-// hardware prefetchers alone kept too few lines in flight there (Add_8u at
-// 1080p, 6 MB a call: 1.15 to 1.2 times faster, sf 0 and 1; C3 at 720p 1.2).
-// Within the core's caches the fetches only cost load slots (640 x 480: 1.05
-// times slower), and beyond half the shared cache, where the sources come
-// from memory, they got in the way of the hardware's (4K in place: 1.2 times
-// slower); streamed calls gain nothing either way.
-inline constexpr int kFetchAhead = 512;
 template <class Op>
 concept HasVec4 = requires(const Op& o, const simd::VI* v, simd::VI* r) { o.Vec4(v, v, r); };
 
