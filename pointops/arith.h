@@ -475,7 +475,6 @@ struct Pattern {
 // of the next lines would otherwise wait behind them (Div_32f at 1080p: 766
 // to 736 us, and 4.5 to 4.2 us on 64 KB rows in L2).
 inline constexpr int kPrefetchAhead = 1024;
-
 template <class Op>
 concept HasVec4 = requires(const Op& o, const simd::VI* v, simd::VI* r) { o.Vec4(v, v, r); };
 
@@ -561,6 +560,15 @@ template <int kPart, Src2 K, class Op, class T, Lay L>
     }
 }
 
+// One row of n units: d = op(a, b), op(a, value pattern) or op(a). Vector body
+// in groups of the pattern's registers, then single registers, then the rest:
+// one more register ending at the row's end, or two overlapping parts in a
+// row shorter than a register, or (ops of kScalarTail, rows under 4 bytes)
+// scalar units. The overlapping registers read their inputs before
+// anything is stored, so units done twice get the same value in place too.
+// AC4: the alpha units of d keep their value. A selects aligned loads and
+// stores, kNt (aligned rows only) streamed stores of the vectors, fenced by
+// the caller, and kFetch (aligned rows only) fetching the sources ahead.
 template <class Op, class T, Lay L, Src2 K, bool A, bool kNt = false, bool kFetch = false>
 void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const typename Op::Unit* a,
               const typename Op::Unit* b, typename Op::Unit* d, std::ptrdiff_t n)
