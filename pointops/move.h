@@ -146,8 +146,9 @@ struct MoveTable {
     Plan plan;
 };
 
+// Maps of four channels, which move as a transpose (below).
 template <class M>
-constexpr bool IsQuadMap()
+constexpr bool IsQuad()
 {
     if constexpr (requires { M::kQuad; }) return M::kQuad;
     else return false;
@@ -222,7 +223,7 @@ constexpr MoveTable BuildMoveTable()
         for (int q = 0; q < M::kIn; ++q)
             for (int p = 0; p < 16; ++p) t.pick[o][q][p] = owner[p] == q ? -1 : 0;
     }
-    if (distinct && M::kOutPlanar && !IsQuadMap<M>()) t.plan = Plan::kBlendShuffle;
+    if (distinct && M::kOutPlanar && !IsQuad<M>()) t.plan = Plan::kBlendShuffle;
 
     return t;
 }
@@ -235,13 +236,6 @@ inline constexpr MoveTable kMoveTable = BuildMoveTable<M>();
 // channel into one lane (c * 4 + p * S + e <- p * 4 S + c * S + e) and
 // ungroup[] undoes it; 4-byte elements need neither. 12 instructions per 64
 // bytes where the per-output shuffles take 28.
-template <class M>
-constexpr bool IsQuad()
-{
-    if constexpr (requires { M::kQuad; }) return M::kQuad;
-    else return false;
-}
-
 template <int S>
 struct QuadTable {
     alignas(16) std::int8_t group[16];
