@@ -30,10 +30,11 @@ struct Pixel {
 // A row of kReplicateMin bytes or more fills its first kReplicatePeriod bytes
 // and copies them forward over the rest with one overlapping string move
 // (each byte copied from kReplicatePeriod bytes before it). The distance
-// matters: the move runs at memset speed from about 6 KB, but at 192 bytes it
-// ran at half that and at 3 KB at a third (6.2 MB C3 fills), as each load
-// then waits for stores still in flight. The period is a multiple of the
-// 48-byte pattern period and of the 64-byte line.
+// matters: the move ran at memset speed from about 6 KB on 6.2 MB C3 fills
+// and at 0.9 of it from about 24 KB on 25 MB ones, but at 192 bytes at half
+// that and at 3 KB at a third, as each load then waits for stores still in
+// flight. The period is a multiple of the 48-byte pattern period and of the
+// 64-byte line.
 //
 // Separate rows of kRowCopyMin bytes or more are copies of the first row,
 // which stays in the cache: 4K C3 frames with padded rows fill at memset
