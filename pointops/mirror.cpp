@@ -126,22 +126,20 @@ inline void Put(Bytes* p, VI v)
 // each 64 bytes copied (1080p 8u C4: 1.1 to 1.2 times faster; fetching only
 // the first lines of each row gained a third of that). When the region is in
 // the cache the fetches only take load slots (8 MB: 1.07 times slower), and
-// the reversed flips, which have more work per byte, gained nothing. dst is
-// null when the stores are streamed.
+// the reversed flips, which have more work per byte, gained nothing.
 struct RowsAhead {
     const Bytes* src;
     const Bytes* dst;
     void At(std::ptrdiff_t srcOffset, std::ptrdiff_t dstOffset) const
     {
         Prefetch(src + srcOffset);
-        if (dst) Prefetch(dst + dstOffset);
+        Prefetch(dst + dstOffset);
     }
 };
 
 // Copies n bytes of one row (flip 0), 64 bytes a step; AC4 blends the
 // destination alpha back (n and the start are whole pixels there). Streaming
-// stores start where the destination is aligned (AC4 rows are streamed only
-// when their start is aligned).
+// stores (never with alpha) start where the destination is aligned.
 template <class Px, bool kAlpha, int S>
 void CopyRow(const Bytes* s, Bytes* d, std::ptrdiff_t n, VI alpha)
 {
@@ -389,27 +387,45 @@ void ExchangeReversedRows(Bytes* a, Bytes* b, std::ptrdiff_t width, const typena
     StoreRow<NV>(b, bytes, ob);
 }
 
-// One destination row: streamed (8u C1 flip 0 from the first aligned byte,
-// otherwise only when the row starts aligned), aligned or unaligned.
-template <class Px, bool kAlpha>
-void MirrorOneRow(const Bytes* s, Bytes* d, std::ptrdiff_t width, int flip, bool nt, const typename Px::Plan& plan,
-                  VI alpha)
+// Flip 0 without alpha: row copies, by the C runtime, or streamed a row at a
+// time from the outer rows inwards (from the first aligned byte of a row).
+template <class Px>
+void CopyRows(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdiff_t ds, PvxiSize roi, bool nt)
 {
-    bool aligned = IsAligned(d);
-    if (flip == 0) {
-        std::ptrdiff_t n = width * Px::kSize;
-        if (nt && (aligned || !kAlpha)) CopyRow<Px, kAlpha, kStream>(s, d, n, alpha);
-        else if (aligned) CopyRow<Px, kAlpha, kAligned>(s, d, n, alpha);
-        else CopyRow<Px, kAlpha, kUnaligned>(s, d, n, alpha);
-    } else {
-        if (nt && aligned) ReverseRow<Px, kAlpha, kStream>(s, d, width, plan, alpha);
-        else if (aligned) ReverseRow<Px, kAlpha, kAligned>(s, d, width, plan, alpha);
-        else ReverseRow<Px, kAlpha, kUnaligned>(s, d, width, plan, alpha);
+    const int h = roi.height;
+    const std::ptrdiff_t n = roi.width * Px::kSize;
+    if (!nt) {
+        for (int y = 0; y < h; ++y) std::memmove(dst + ds * y, src + ss * (h - 1 - y), static_cast<std::size_t>(n));
+        return;
     }
+    const VI none = Zero();
+    for (int y = 0; y <= h - 1 - y; ++y) {
+        const int y2 = h - 1 - y;
+        CopyRow<Px, false, kStream>(src + ss * y2, dst + ds * y, n, none);
+        if (y != y2) CopyRow<Px, false, kStream>(src + ss * y, dst + ds * y2, n, none);
+    }
+    StoreFence();
+}
+
+// One destination row reversed (flips 1 and 2): streamed (never with alpha)
+// when the row starts aligned, aligned or unaligned.
+template <class Px, bool kAlpha>
+void ReverseOneRow(const Bytes* s, Bytes* d, std::ptrdiff_t width, bool nt, const typename Px::Plan& plan, VI alpha)
+{
+    const bool aligned = IsAligned(d);
+    if constexpr (!kAlpha) {
+        if (nt && aligned) {
+            ReverseRow<Px, false, kStream>(s, d, width, plan, alpha);
+            return;
+        }
+    }
+    if (aligned) ReverseRow<Px, kAlpha, kAligned>(s, d, width, plan, alpha);
+    else ReverseRow<Px, kAlpha, kUnaligned>(s, d, width, plan, alpha);
 }
 
 // Destination rows y and height-1-y are written together, from the outer
-// rows inwards; the middle row of an odd height alone.
+// rows inwards; the middle row of an odd height alone. Flip 0 reaches here
+// only for AC4 members, which never stream.
 template <class Px, bool kAlpha>
 void MirrorRows(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdiff_t ds, PvxiSize roi, int flip, bool nt)
 {
@@ -417,31 +433,41 @@ void MirrorRows(const Bytes* src, std::ptrdiff_t ss, Bytes* dst, std::ptrdiff_t 
     const VI alpha = Px::AlphaMask();
     const int h = roi.height;
     const std::ptrdiff_t width = roi.width, n = width * Px::kSize;
-    const bool ahead = flip == 0 && FetchAhead(2 * n * h);
+    const bool ahead = kAlpha && flip == 0 && FetchAhead(2 * n * h);
     for (int y = 0; y <= h - 1 - y; ++y) {
         int y2 = h - 1 - y;
         const Bytes* s0 = src + ss * (flip == 1 ? y : y2);
         const Bytes* s1 = src + ss * (flip == 1 ? y2 : y);
         Bytes* d0 = dst + ds * y;
         Bytes* d1 = dst + ds * y2;
-        if (y == y2 || (nt && !kAlpha && flip == 0)) {
-            MirrorOneRow<Px, kAlpha>(s0, d0, width, flip, nt, plan, alpha);
-            if (y != y2) MirrorOneRow<Px, kAlpha>(s1, d1, width, flip, nt, plan, alpha);
+        bool aligned = IsAligned(d0) && IsAligned(d1);
+        if constexpr (kAlpha) {
+            if (flip == 0) {
+                if (y == y2) {
+                    if (IsAligned(d0)) CopyRow<Px, true, kAligned>(s0, d0, n, alpha);
+                    else CopyRow<Px, true, kUnaligned>(s0, d0, n, alpha);
+                    continue;
+                }
+                RowsAhead next{src + ss * (y2 - 1), d1 - ds};
+                if (aligned && ahead) CopyRowPair<Px, true, kAligned, true>(s0, d0, s1, d1, n, alpha, next);
+                else if (aligned) CopyRowPair<Px, true, kAligned, false>(s0, d0, s1, d1, n, alpha, next);
+                else if (ahead) CopyRowPair<Px, true, kUnaligned, true>(s0, d0, s1, d1, n, alpha, next);
+                else CopyRowPair<Px, true, kUnaligned, false>(s0, d0, s1, d1, n, alpha, next);
+                continue;
+            }
+        }
+        if (y == y2) {
+            ReverseOneRow<Px, kAlpha>(s0, d0, width, nt, plan, alpha);
             continue;
         }
-        bool aligned = IsAligned(d0) && IsAligned(d1);
-        if (flip == 0) {
-            RowsAhead next{src + ss * (y2 - 1), nt ? nullptr : d1 - ds};
-            if (aligned && nt) CopyRowPair<Px, kAlpha, kStream, true>(s0, d0, s1, d1, n, alpha, next);
-            else if (aligned && ahead) CopyRowPair<Px, kAlpha, kAligned, true>(s0, d0, s1, d1, n, alpha, next);
-            else if (aligned) CopyRowPair<Px, kAlpha, kAligned, false>(s0, d0, s1, d1, n, alpha, next);
-            else if (ahead) CopyRowPair<Px, kAlpha, kUnaligned, true>(s0, d0, s1, d1, n, alpha, next);
-            else CopyRowPair<Px, kAlpha, kUnaligned, false>(s0, d0, s1, d1, n, alpha, next);
-        } else {
-            if (aligned && nt) ReverseRowPair<Px, kAlpha, kStream>(s0, d0, s1, d1, width, plan, alpha);
-            else if (aligned) ReverseRowPair<Px, kAlpha, kAligned>(s0, d0, s1, d1, width, plan, alpha);
-            else ReverseRowPair<Px, kAlpha, kUnaligned>(s0, d0, s1, d1, width, plan, alpha);
+        if constexpr (!kAlpha) {
+            if (aligned && nt) {
+                ReverseRowPair<Px, false, kStream>(s0, d0, s1, d1, width, plan, alpha);
+                continue;
+            }
         }
+        if (aligned) ReverseRowPair<Px, kAlpha, kAligned>(s0, d0, s1, d1, width, plan, alpha);
+        else ReverseRowPair<Px, kAlpha, kUnaligned>(s0, d0, s1, d1, width, plan, alpha);
     }
     if (nt) StoreFence();
 }
@@ -529,11 +555,12 @@ PvxStatus MirrorBody(const T* pSrc, int srcStep, T* pDst, int dstStep, PvxiSize 
     std::int64_t pixels = std::int64_t{roi.width} * roi.height;
     bool nt = false;
     if constexpr (!kKeepsAlpha<L>) nt = StreamWorkingSet(2 * pixels * Px::kSize);
-    if (flip == 0 && !kKeepsAlpha<L> && !nt) {
-        const std::size_t n = static_cast<std::size_t>(roi.width) * Px::kSize;
-        for (int y = 0; y < roi.height; ++y)
-            std::memmove(RowAt(pDst, dstStep, y), RowAt(pSrc, srcStep, roi.height - 1 - y), n);
-        return pvxStsNoErr;
+    if constexpr (!kKeepsAlpha<L>) {
+        if (flip == 0) {
+            CopyRows<Px>(reinterpret_cast<const Bytes*>(pSrc), srcStep, reinterpret_cast<Bytes*>(pDst), dstStep, roi,
+                         nt);
+            return pvxStsNoErr;
+        }
     }
     MirrorRows<Px, kKeepsAlpha<L>>(reinterpret_cast<const Bytes*>(pSrc), srcStep, reinterpret_cast<Bytes*>(pDst),
                                    dstStep, roi, flip, nt);
