@@ -49,7 +49,7 @@ using namespace pvxtest;
 using pvxref::RefMirror;
 using pvxref::RefTranspose;
 
-constexpr int kCache = 300000;  // under a quarter of the regions below
+constexpr int kCache = 300000;  // every large region below reads and writes more than half of it
 
 template <class T>
 void TransposeLarge(PvxStatus (*fn)(const T*, int, T*, int, PvxiSize), int ch, int w, int h, std::uint64_t seed)
