@@ -652,9 +652,20 @@ void ArithRow(const Op& op, const Pattern<typename Op::Unit, T, L>& pat, const t
     }
 }
 
-// Whether a call's sources are to be fetched ahead: by the bytes it reads
-// and writes (an image given as both sources, as Sqr does, is read once),
-// for calls whose rows all start aligned.
+// The bytes a call reads and writes, from the bytes of one image: an image
+// given as both sources (Sqr, Mul of an image by itself) is read once, and
+// an image written in place counts as read only.
+template <Src2 K, class T>
+inline std::int64_t BytesTouched(const T* a, const T* b, const T* d, std::int64_t imageBytes)
+{
+    const void* out = d;
+    const bool inPlace = out == a || out == b;
+    const std::int64_t images = (K == Src2::kImage && static_cast<const void*>(a) != b ? 2 : 1) + !inPlace;
+    return images * imageBytes;
+}
+
+// Whether a call's sources are to be fetched ahead (FetchSources), for calls
+// whose rows all start aligned.
 template <Src2 K, class Op, class T>
 inline bool WantsFetch(const Op& op, const T* a, int aStep, const T* b, int bStep, const T* d, int dStep, int rows,
                        std::int64_t imageBytes)
@@ -662,10 +673,7 @@ inline bool WantsFetch(const Op& op, const T* a, int aStep, const T* b, int bSte
     if (imageBytes <= kFetchSourcesMin / 3) return false;
     if (!simd::IsAligned(a) || !simd::IsAligned(b) || !simd::IsAligned(d)) return false;
     if (rows > 1 && ((aStep | bStep | dStep) & 15) != 0) return false;
-    const void* out = d;
-    const bool inPlace = out == a || out == b;
-    const std::int64_t images = (K == Src2::kImage && static_cast<const void*>(a) != b ? 2 : 1) + !inPlace;
-    return op.Vector() && FetchSources(images * imageBytes);
+    return op.Vector() && FetchSources(BytesTouched<K>(a, b, d, imageBytes));
 }
 
 // The rows of a call whose sources are fetched ahead, kept out of line: the
@@ -713,11 +721,7 @@ void RunRows(const Op& op, const T* a, int aStep, const T* b, int bStep, T* d, i
     bool nt = false;
     if constexpr (kCanStream) {
         const void* out = d;
-        if (op.Vector() && out != a && out != b) {
-            // an image given as both sources (Sqr, Mul of an image by itself) is read once
-            std::int64_t images = K == Src2::kImage && static_cast<const void*>(a) != b ? 3 : 2;
-            nt = StreamWorkingSet(images * rowBytes * rows);
-        }
+        if (op.Vector() && out != a && out != b) nt = StreamWorkingSet(BytesTouched<K>(a, b, d, rowBytes * rows));
     }
     if (merged) {
         n *= rows;
